@@ -11,11 +11,11 @@ namespace brasel::app {
 
 // The five lines of Config.cfg.
 struct ConfigCfg {
-    QString pastaDados;         // data folder of the embedded server
-    QString ficheiroChave;      // signing-key file
-    QString numeroCertificado;  // software certificate number printed on documents
-    QString mapaPortas;         // file of "COMn=/dev/..." lines
-    QString pastaActualizacoes; // where the updater looks for newer releases
+    QString pastaDados;          // data folder of the embedded server
+    QString ficheiroChave;       // signing-key file
+    QString numeroCertificado;   // software certificate number printed on documents
+    QString mapaPortas;          // file of "COMn=/dev/..." lines
+    QString pastaActualizacoes;  // where the updater looks for newer releases
 };
 
 // Process-wide state: created by main (or by a test) and passed by reference. Members keep the

@@ -12,7 +12,16 @@ namespace brasel::app {
 // The kinds of amount that carry their own rounding rule and decimals, in the order of the
 // ParamGeral column suffixes: cliarre<valor>, clidec<valor>, ...
 enum class KindArre : int {
-    valor, iva, desc, merlin, desclin, ivalin, mergeral, descgeral, ivageral, totalgeral
+    valor,
+    iva,
+    desc,
+    merlin,
+    desclin,
+    ivalin,
+    mergeral,
+    descgeral,
+    ivageral,
+    totalgeral
 };
 // The cash-document kinds: caiarre<mergeral>, ...
 enum class KindCaixa : int { mergeral, descgeral, ivageral, totalgeral };

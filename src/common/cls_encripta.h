@@ -7,7 +7,7 @@ namespace brasel {
 // The company-list cipher: the passwords of the server list are stored under Blowfish with a
 // fixed key, as upper-case hexadecimal text so that they survive the settings store.
 class clsEncripta {
-public:
+  public:
     // Algorithm 0 is Blowfish, the only one the program uses; any other number gives "".
     static QString Encripta(int algoritmo, const QString& chave, const QString& texto);
     // "" when the text is not a cipher text of that key.

@@ -84,7 +84,8 @@ bool parseDecimal(std::string_view text, std::int64_t& out) {
             mantissa = 0;
         } else {
             __int128 divisor = 1;
-            for (int k = 0; k < -shift; ++k) divisor *= 10;
+            for (int k = 0; k < -shift; ++k)
+                divisor *= 10;
             __int128 quotient = mantissa / divisor;
             const __int128 twice = (mantissa % divisor) * 2;
             if (twice > divisor || (twice == divisor && (droppedNonZero || quotient % 2 != 0))) {
@@ -135,12 +136,14 @@ QString Currency::toText(int decimals) const {
     if (decimals < 0) decimals = 0;
     if (decimals > 4) decimals = 4;
     __int128 divisor = 1;
-    for (int k = decimals; k < 4; ++k) divisor *= 10;
+    for (int k = decimals; k < 4; ++k)
+        divisor *= 10;
     const __int128 scaled = divideTiesToEven(raw_, divisor);
     const bool negative = scaled < 0;
     unsigned __int128 magnitude = negative ? -scaled : scaled;
     std::uint64_t unitDivisor = 1;
-    for (int k = 0; k < decimals; ++k) unitDivisor *= 10;
+    for (int k = 0; k < decimals; ++k)
+        unitDivisor *= 10;
     const auto units = static_cast<std::uint64_t>(magnitude / unitDivisor);
     const auto fraction = static_cast<std::uint64_t>(magnitude % unitDivisor);
     QString text = negative ? QStringLiteral("-") : QString();
@@ -154,7 +157,8 @@ QString Currency::toText(int decimals) const {
 
 QString Currency::toPlainText() const {
     QString text = toText(4);
-    while (text.endsWith(QLatin1Char('0'))) text.chop(1);
+    while (text.endsWith(QLatin1Char('0')))
+        text.chop(1);
     if (text.endsWith(QLatin1Char('.'))) text.chop(1);
     if (text == QStringLiteral("-0")) text = QStringLiteral("0");
     return text;

@@ -13,14 +13,14 @@ namespace brasel {
 // An amount that does not fit in the fixed-point range; raised by the arithmetic and caught by
 // the money routines, which return their failure value instead of a wrapped number.
 class CurrencyOverflow : public std::overflow_error {
-public:
+  public:
     CurrencyOverflow() : std::overflow_error("amount out of range") {}
 };
 
 // Money, prices, quantities and points: a signed count of ten-thousandths. Built only from
 // integers, decimal text or an explicit rounding conversion (CCur), never implicitly from double.
 class Currency {
-public:
+  public:
     static constexpr std::int64_t kScale = 10000;
 
     constexpr Currency() = default;
@@ -65,7 +65,7 @@ public:
         return a.raw_ <=> b.raw_;
     }
 
-private:
+  private:
     std::int64_t raw_ = 0;
 };
 

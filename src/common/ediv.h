@@ -8,7 +8,7 @@ namespace brasel {
 // its two halves swapped. Encrypt and Decrypt are the same transformation; applied twice it gives
 // the text back, and the length never changes.
 class EDiv {
-public:
+  public:
     static QString Encrypt(const QString& texto);
     static QString Decrypt(const QString& texto);
 };

@@ -41,13 +41,13 @@ bool isMasterName(const QString& baseDados) {
     return baseDados.compare(QStringLiteral("master"), Qt::CaseInsensitive) == 0;
 }
 
-QString osUserName() {
+}  // namespace
+
+QString utilizadorSistema() {
     QString user = qEnvironmentVariable("USER");
     if (user.isEmpty()) user = qEnvironmentVariable("USERNAME");
     return user;
 }
-
-}  // namespace
 
 QString sqliteFilePath(const QString& folder, const QString& baseDados) {
     const QString file = isMasterName(baseDados) ? QStringLiteral("master.sqlite")
@@ -57,13 +57,17 @@ QString sqliteFilePath(const QString& folder, const QString& baseDados) {
 
 Connection::Connection() = default;
 
-Connection::~Connection() { close(); }
+Connection::~Connection() {
+    close();
+}
 
 bool Connection::isOpen() const {
     return open_ && QSqlDatabase::database(name_, false).isOpen();
 }
 
-QSqlDatabase Connection::database() const { return QSqlDatabase::database(name_, false); }
+QSqlDatabase Connection::database() const {
+    return QSqlDatabase::database(name_, false);
+}
 
 bool Connection::openPhysical(const ConnectionParams& p, const QString& name) {
     const Dialect dialect(p.server.engine);
@@ -78,8 +82,9 @@ bool Connection::openPhysical(const ConnectionParams& p, const QString& name) {
                 return false;
             }
             const bool windows = p.autenticacao == QStringLiteral("WIN");
-            const QString login = windows ? osUserName() : p.login;
-            if (!p.criar && !MasterLogins(p.server.folder).verificar(login, p.password, p.autenticacao)) {
+            const QString login = windows ? utilizadorSistema() : p.login;
+            if (!p.criar &&
+                !MasterLogins(p.server.folder).verificar(login, p.password, p.autenticacao)) {
                 lastError_ = QStringLiteral("Utilizador ou password inválidos.");
                 return false;
             }
@@ -100,9 +105,10 @@ bool Connection::openPhysical(const ConnectionParams& p, const QString& name) {
             const bool windows = p.autenticacao == QStringLiteral("WIN");
             db.setHostName(p.server.host);
             db.setPort(p.server.port);
-            db.setDatabaseName(isMasterName(p.baseDados) ? QStringLiteral("postgres")
-                                                         : dialect.physicalDatabaseName(p.baseDados));
-            db.setUserName(dialect.physicalLoginName(windows ? osUserName() : p.login));
+            db.setDatabaseName(isMasterName(p.baseDados)
+                                   ? QStringLiteral("postgres")
+                                   : dialect.physicalDatabaseName(p.baseDados));
+            db.setUserName(dialect.physicalLoginName(windows ? utilizadorSistema() : p.login));
             if (!windows) db.setPassword(p.password);
             db.setConnectOptions(QStringLiteral("connect_timeout=%1").arg(qMax(1, p.tempoLigacao)));
             if (!db.open()) {
@@ -110,12 +116,14 @@ bool Connection::openPhysical(const ConnectionParams& p, const QString& name) {
                 return false;
             }
             QSqlQuery setup(db);
-            setup.exec(QStringLiteral("SET statement_timeout = %1").arg(qMax(0, p.tempoComando) * 1000));
+            setup.exec(
+                QStringLiteral("SET statement_timeout = %1").arg(qMax(0, p.tempoComando) * 1000));
             setup.exec(QStringLiteral("SET client_min_messages = warning"));
             return true;
         }
         case Engine::SqlServer:
-            lastError_ = QStringLiteral("O servidor SQL Server ainda não é suportado nesta instalação.");
+            lastError_ =
+                QStringLiteral("O servidor SQL Server ainda não é suportado nesta instalação.");
             return false;
     }
     return false;
@@ -139,7 +147,8 @@ bool Connection::open(const ConnectionParams& params) {
             QSqlDatabase::removeDatabase(name);
         }
     }
-    const QString name = QStringLiteral("brasel-%1").arg(nextConnectionNumber.fetchAndAddRelaxed(1));
+    const QString name =
+        QStringLiteral("brasel-%1").arg(nextConnectionNumber.fetchAndAddRelaxed(1));
     if (!openPhysical(params, name)) {
         QSqlDatabase::removeDatabase(name);
         return false;
@@ -184,7 +193,8 @@ std::optional<QSqlQuery> Connection::exec(const QString& sql, const QVariantList
     } else {
         ok = query.prepare(sql);
         if (ok) {
-            for (const QVariant& value : values) query.addBindValue(value);
+            for (const QVariant& value : values)
+                query.addBindValue(value);
             ok = query.exec();
         }
     }

@@ -15,7 +15,7 @@ namespace brasel::db {
 // What a connection is opened with; the credentials are already plain text here.
 struct ConnectionParams {
     ServerAddress server;
-    QString baseDados;        // "Vendrola0001", or "Master" for the server's own catalogue
+    QString baseDados;  // "Vendrola0001", or "Master" for the server's own catalogue
     QString login;
     QString password;
     QString autenticacao;     // "SQL" or "WIN", already checked
@@ -29,7 +29,7 @@ struct ConnectionParams {
 // session back to the pool (unless opened without pooling), so a routine that opens and closes
 // a connection on every call does not pay for a new session each time.
 class Connection {
-public:
+  public:
     Connection();
     ~Connection();
     Connection(const Connection&) = delete;
@@ -52,7 +52,7 @@ public:
     // Whether a write transaction is open on this connection (transactions are never nested).
     bool inTransaction() const { return inTransaction_; }
 
-private:
+  private:
     friend class WriteTransaction;
     bool beginWrite();
     bool commit();
@@ -69,7 +69,7 @@ private:
 
 // Rolls the transaction back unless commit() was called: every multi-row write goes through one.
 class WriteTransaction {
-public:
+  public:
     explicit WriteTransaction(Connection& conn);
     ~WriteTransaction();
     WriteTransaction(const WriteTransaction&) = delete;
@@ -78,10 +78,13 @@ public:
     bool active() const { return active_; }
     bool commit();
 
-private:
+  private:
     Connection& conn_;
     bool active_ = false;
 };
+
+// The operating-system user, the login of Windows-style authentication.
+QString utilizadorSistema();
 
 // The embedded engine's file for a database name inside a server folder.
 QString sqliteFilePath(const QString& folder, const QString& baseDados);

@@ -9,7 +9,7 @@ namespace brasel::db {
 // What differs between the engines, in one place. Everything else the program writes is
 // portable SQL (COALESCE, LIMIT, CAST, ||) that both engines run unchanged.
 class Dialect {
-public:
+  public:
     explicit Dialect(Engine engine) : engine_(engine) {}
 
     Engine engine() const { return engine_; }
@@ -29,17 +29,20 @@ public:
     QString beginWriteTransaction() const;
 
     // Catalog questions; each statement takes its names as bound values.
-    QString tableExistsQuery() const;        // binds: table name
-    QString columnExistsQuery() const;       // binds: table name, column name
-    QString companyDatabasesQuery() const;   // server engines: names of Vendrola databases
-    QString databaseSizeQuery() const;       // binds: database name; size in bytes
+    QString tableExistsQuery() const;       // binds: table name
+    QString columnExistsQuery() const;      // binds: table name, column name
+    QString companyDatabasesQuery() const;  // server engines: names of Vendrola databases
+    QString databaseSizeQuery() const;      // binds: database name; size in bytes
+
+    // A condition true when a text column holds a whole number (optionally signed).
+    QString numericTextCondition(const QString& column) const;
 
     // The database name an engine stores for a company database name ("Vendrola0001").
     QString physicalDatabaseName(const QString& name) const;
     // A role or login name as the engine keeps it.
     QString physicalLoginName(const QString& login) const;
 
-private:
+  private:
     Engine engine_;
 };
 

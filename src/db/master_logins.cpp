@@ -43,7 +43,7 @@ QMutex& verificadosMutex() {
 
 // A short-lived connection of its own to master.sqlite.
 class MasterDb {
-public:
+  public:
     explicit MasterDb(const QString& file)
         : name_(QStringLiteral("master-") + QUuid::createUuid().toString(QUuid::WithoutBraces)) {
         QSqlDatabase db = QSqlDatabase::addDatabase(QStringLiteral("QSQLITE"), name_);
@@ -65,7 +65,7 @@ public:
     bool ok() const { return ok_; }
     QSqlDatabase db() const { return QSqlDatabase::database(name_, false); }
 
-private:
+  private:
     QString name_;
     bool ok_ = false;
 };
@@ -78,7 +78,9 @@ QString MasterLogins::filePath() const {
     return QDir(folder_).filePath(QStringLiteral("master.sqlite"));
 }
 
-bool MasterLogins::exists() const { return QFileInfo::exists(filePath()); }
+bool MasterLogins::exists() const {
+    return QFileInfo::exists(filePath());
+}
 
 bool MasterLogins::criar(const QString& login, const QString& password, bool sysAdmin,
                          QString* erro) {
@@ -140,8 +142,8 @@ bool MasterLogins::verificar(const QString& login, const QString& password,
     if (!exists()) return false;
     const bool windows = autenticacao.compare(QStringLiteral("WIN"), Qt::CaseInsensitive) == 0;
     if (windows) return existe(login);
-    const QByteArray chave = (folder_ + QChar(0) + login.trimmed().toLower() + QChar(0) + password)
-                                 .toUtf8();
+    const QByteArray chave =
+        (folder_ + QChar(0) + login.trimmed().toLower() + QChar(0) + password).toUtf8();
     {
         QMutexLocker lock(&verificadosMutex());
         if (verificados().contains(chave)) return true;
@@ -169,7 +171,8 @@ QStringList MasterLogins::logins() const {
     MasterDb master(filePath());
     QSqlQuery q(master.db());
     if (master.ok() && q.exec(QStringLiteral("select Nome from Logins order by Nome"))) {
-        while (q.next()) result << q.value(0).toString();
+        while (q.next())
+            result << q.value(0).toString();
     }
     return result;
 }

@@ -2,7 +2,9 @@
 
 namespace brasel::db {
 
-QString nomeBaseDados(const QString& empresa) { return QStringLiteral("Vendrola") + empresa; }
+QString nomeBaseDados(const QString& empresa) {
+    return QStringLiteral("Vendrola") + empresa;
+}
 
 QString codigoEmpresa(const QString& nomeBaseDados) {
     if (nomeBaseDados.size() != 12 ||

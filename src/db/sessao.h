@@ -8,9 +8,9 @@ namespace brasel::db {
 
 // The selected company, the credentials in use and the connections to its database.
 struct Sessao {
-    QString gEmpresa;       // 4-character company code
+    QString gEmpresa;  // 4-character company code
     QString gNomeEmpresa;
-    QString gServidor;      // server text (folder, postgresql://...)
+    QString gServidor;  // server text (folder, postgresql://...)
     QString gLogin;
     QString gPassword;      // plain in memory; encrypted in the company list
     QString gAutenticacao;  // "SQL" or "WIN"
