@@ -12,6 +12,9 @@
 
 #include <climits>
 
+#include <pwd.h>
+#include <unistd.h>
+
 namespace brasel::db {
 
 namespace {
@@ -44,9 +47,10 @@ bool isMasterName(const QString& baseDados) {
 }  // namespace
 
 QString utilizadorSistema() {
-    QString user = qEnvironmentVariable("USER");
-    if (user.isEmpty()) user = qEnvironmentVariable("USERNAME");
-    return user;
+    if (const passwd* entry = getpwuid(geteuid()); entry != nullptr && entry->pw_name != nullptr) {
+        return QString::fromLocal8Bit(entry->pw_name);
+    }
+    return qEnvironmentVariable("USER");
 }
 
 QString sqliteFilePath(const QString& folder, const QString& baseDados) {
@@ -161,6 +165,7 @@ bool Connection::open(const ConnectionParams& params) {
 }
 
 void Connection::close() {
+    prepared_.clear();
     if (name_.isEmpty()) return;
     if (inTransaction_) rollback();
     const bool reuse = open_ && !params_.semPooling && !params_.criar &&
@@ -203,6 +208,44 @@ std::optional<QSqlQuery> Connection::exec(const QString& sql, const QVariantList
         return std::nullopt;
     }
     return query;
+}
+
+std::optional<QSqlRecord> Connection::firstRow(const QString& sql, const QVariantList& values) {
+    if (!isOpen()) {
+        lastError_ = QStringLiteral("A ligação à base de dados não está aberta.");
+        return std::nullopt;
+    }
+    // A statement prepared before the table changed may refuse to run again; it is then
+    // prepared anew once.
+    for (int tentativa = 0; tentativa < 2; ++tentativa) {
+        auto found = prepared_.find(sql);
+        const bool novo = found == prepared_.end();
+        if (novo) {
+            QSqlQuery query(database());
+            query.setForwardOnly(true);
+            if (!query.prepare(sql)) {
+                lastError_ = query.lastError().text();
+                return std::nullopt;
+            }
+            // Bounded: the statements a routine repeats are few, the texts built per call many.
+            if (prepared_.size() >= 128) prepared_.clear();
+            found = prepared_.insert(sql, query);
+        }
+        QSqlQuery& query = found.value();
+        for (int i = 0; i < values.size(); ++i)
+            query.bindValue(i, values[i]);
+        if (!query.exec()) {
+            lastError_ = query.lastError().text();
+            prepared_.erase(found);
+            if (novo || inTransaction_) return std::nullopt;
+            continue;
+        }
+        std::optional<QSqlRecord> row;
+        if (query.next()) row = query.record();
+        query.finish();
+        return row;
+    }
+    return std::nullopt;
 }
 
 bool Connection::beginWrite() {

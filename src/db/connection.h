@@ -3,8 +3,10 @@
 #include "db/dialect.h"
 #include "db/server_address.h"
 
+#include <QHash>
 #include <QSqlDatabase>
 #include <QSqlQuery>
+#include <QSqlRecord>
 #include <QString>
 #include <QVariantList>
 
@@ -49,6 +51,11 @@ class Connection {
     std::optional<QSqlQuery> exec(const QString& sql, const QVariantList& values = {});
     QString lastError() const { return lastError_; }
 
+    // The first row of a statement, or nullopt when it has none or fails. The statement stays
+    // prepared on this connection for the next call with the same text, and is finished before
+    // returning, so it holds no lock.
+    std::optional<QSqlRecord> firstRow(const QString& sql, const QVariantList& values = {});
+
     // Whether a write transaction is open on this connection (transactions are never nested).
     bool inTransaction() const { return inTransaction_; }
 
@@ -61,6 +68,7 @@ class Connection {
 
     QString name_;
     ConnectionParams params_;
+    QHash<QString, QSqlQuery> prepared_;
     Dialect dialect_{Engine::Sqlite};
     QString lastError_;
     bool open_ = false;

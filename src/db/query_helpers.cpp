@@ -34,9 +34,7 @@ QString maisUm(const QVariant& maximo) {
 
 std::optional<QSqlRecord> primeiraLinha(Connection& conn, const QString& sql,
                                         const QVariantList& valores) {
-    auto q = conn.exec(sql, valores);
-    if (!q || !q->next()) return std::nullopt;
-    return q->record();
+    return conn.firstRow(sql, valores);
 }
 
 QString Select_Campo_str(Sessao& sessao, const QString& tabela, const QString& campo,
