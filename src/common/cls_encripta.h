@@ -5,7 +5,8 @@
 namespace brasel {
 
 // The company-list cipher: the passwords of the server list are stored under Blowfish with a
-// fixed key, as upper-case hexadecimal text so that they survive the settings store.
+// fixed key, as upper-case hexadecimal text so that they survive the settings store. The text is
+// taken as UTF-8, the mode is ECB with PKCS#7 padding, and an empty text stays empty.
 class clsEncripta {
   public:
     // Algorithm 0 is Blowfish, the only one the program uses; any other number gives "".

@@ -9,6 +9,7 @@
 #include <QTemporaryDir>
 
 #include <gtest/gtest.h>
+#include "support/impressao_qt.h"
 
 namespace brasel::db {
 namespace {

@@ -4,6 +4,7 @@
 #include "db/connections.h"
 #include "db/query_helpers.h"
 #include "db/sysadmin.h"
+#include "support/impressao_qt.h"
 #include "support/servidor_pg.h"
 
 #include <gtest/gtest.h>

@@ -11,6 +11,7 @@
 #include <QThread>
 
 #include <gtest/gtest.h>
+#include "support/impressao_qt.h"
 
 namespace brasel::db {
 namespace {

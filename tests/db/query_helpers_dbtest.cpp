@@ -8,6 +8,7 @@
 #include <QTemporaryDir>
 
 #include <gtest/gtest.h>
+#include "support/impressao_qt.h"
 
 namespace brasel::db {
 namespace {
