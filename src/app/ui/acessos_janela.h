@@ -1,6 +1,7 @@
 #pragma once
 
 #include "app/acessos.h"
+#include "common/message_port.h"
 
 #include <QWidget>
 
