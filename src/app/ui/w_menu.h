@@ -1,0 +1,56 @@
+#pragma once
+
+#include "app/estado.h"
+#include "app/ui/catalogo_janelas.h"
+#include "common/ui/mensagens_janela.h"
+
+#include <QLabel>
+#include <QMainWindow>
+#include <QMdiArea>
+#include <QTimer>
+
+namespace brasel::app {
+
+// The main window: the frame every working window opens in, with its menu, status bar,
+// background picture and timers. Closing it (or logging off) ends the user's work and asks to
+// go back to the login.
+class WMenu : public QMainWindow {
+    Q_OBJECT
+  public:
+    explicit WMenu(Estado& estado, QWidget* pai = nullptr);
+
+    // The load sequence; false when the company is not configured and the program must end.
+    bool carregar();
+
+    QMdiArea* area() const { return area_; }
+    const CatalogoJanelas& catalogo() const { return catalogo_; }
+    // Shows a window inside the frame after its access check; false (and the window deleted)
+    // when refused.
+    bool abrirJanela(QWidget* janela, const QString& caption);
+
+  Q_SIGNALS:
+    // The main window closed: the user's work ended, the login comes back.
+    void terminou();
+
+  protected:
+    void closeEvent(QCloseEvent* evento) override;
+
+  private:
+    void criarMenu();
+    void actualizaBarraEstado();
+    void verificaVersao();
+    void aplicaFundo();
+    void acercaDe();
+    void configurarImpressora();
+
+    Estado& estado_;
+    MensagensJanela mensagens_;
+    CatalogoJanelas catalogo_;
+    QMdiArea* area_;
+    QList<QLabel*> paineis_;
+    QTimer relogio_;
+    QTimer versao_;
+    bool terminado_ = false;
+};
+
+}  // namespace brasel::app
