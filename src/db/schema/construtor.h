@@ -9,7 +9,7 @@ namespace brasel::db::schema {
 // Writes a table of the definition in a few lines: every table starts with its identity
 // column, then the columns in the order they are added.
 class Def {
-public:
+  public:
     explicit Def(const char* nome, const char* identidade = "NumRegisto");
 
     Def& texto(std::initializer_list<const char*> nomes);
@@ -28,18 +28,13 @@ public:
     // A finished description reads as the table it describes.
     operator Tabela() const { return tabela_; }
 
-private:
+  private:
     Def& juntar(std::initializer_list<const char*> nomes, Tipo tipo);
     Tabela tabela_;
 };
 
 // Code and description with the identity: the master tables that only a lookup reads.
 Tabela tabelaCodigoDescricao(const char* nome);
-
-// The ten kinds of amount that carry their own decimals and rounding mode, in the order of the
-// column suffixes: valor, iva, desc, merlin, desclin, ivalin, mergeral, descgeral, ivageral,
-// totalgeral.
-QStringList sufixosArredondamento();
 
 void acrescentaConfiguracao(QList<Tabela>& tabelas);
 void acrescentaMestres(QList<Tabela>& tabelas);

@@ -2,29 +2,29 @@
 
 namespace brasel::db::schema {
 
-const Coluna* Tabela::coluna(QStringView nomeColuna) const {
-    for (const Coluna& c : colunas) {
-        if (nomeColuna.compare(c.nome, Qt::CaseInsensitive) == 0) return &c;
-    }
-    return nullptr;
-}
-
 Def::Def(const char* nome, const char* identidade) {
     tabela_.nome = QString::fromLatin1(nome);
     tabela_.colunas.append({QString::fromLatin1(identidade), Tipo::Identidade, {}});
 }
 
 Def& Def::juntar(std::initializer_list<const char*> nomes, Tipo tipo) {
-    for (const char* nome : nomes) tabela_.colunas.append({QString::fromLatin1(nome), tipo, {}});
+    for (const char* nome : nomes)
+        tabela_.colunas.append({QString::fromLatin1(nome), tipo, {}});
     return *this;
 }
 
-Def& Def::texto(std::initializer_list<const char*> nomes) { return juntar(nomes, Tipo::Texto); }
-Def& Def::inteiro(std::initializer_list<const char*> nomes) { return juntar(nomes, Tipo::Inteiro); }
+Def& Def::texto(std::initializer_list<const char*> nomes) {
+    return juntar(nomes, Tipo::Texto);
+}
+Def& Def::inteiro(std::initializer_list<const char*> nomes) {
+    return juntar(nomes, Tipo::Inteiro);
+}
 Def& Def::montante(std::initializer_list<const char*> nomes) {
     return juntar(nomes, Tipo::Montante);
 }
-Def& Def::imagem(std::initializer_list<const char*> nomes) { return juntar(nomes, Tipo::Imagem); }
+Def& Def::imagem(std::initializer_list<const char*> nomes) {
+    return juntar(nomes, Tipo::Imagem);
+}
 
 Def& Def::coluna(const QString& nome, Tipo tipo, const char* defeito) {
     tabela_.colunas.append({nome, tipo, QString::fromLatin1(defeito)});
@@ -37,20 +37,23 @@ Def& Def::colunas(const QList<Coluna>& grupo) {
 }
 
 Def& Def::numeradas(const char* prefixo, int n, Tipo tipo) {
-    for (int i = 1; i <= n; ++i) coluna(QString::fromLatin1(prefixo) + QString::number(i), tipo);
+    for (int i = 1; i <= n; ++i)
+        coluna(QString::fromLatin1(prefixo) + QString::number(i), tipo);
     return *this;
 }
 
 Def& Def::unico(std::initializer_list<const char*> nomes, const char* condicao) {
     Indice indice{{}, true, QString::fromLatin1(condicao)};
-    for (const char* nome : nomes) indice.colunas.append(QString::fromLatin1(nome));
+    for (const char* nome : nomes)
+        indice.colunas.append(QString::fromLatin1(nome));
     tabela_.indices.append(indice);
     return *this;
 }
 
 Def& Def::indice(std::initializer_list<const char*> nomes) {
     Indice indice;
-    for (const char* nome : nomes) indice.colunas.append(QString::fromLatin1(nome));
+    for (const char* nome : nomes)
+        indice.colunas.append(QString::fromLatin1(nome));
     tabela_.indices.append(indice);
     return *this;
 }
@@ -65,9 +68,9 @@ Tabela tabelaCodigoDescricao(const char* nome) {
 }
 
 QStringList sufixosArredondamento() {
-    return {QStringLiteral("valor"),    QStringLiteral("iva"),       QStringLiteral("desc"),
-            QStringLiteral("merlin"),   QStringLiteral("desclin"),   QStringLiteral("ivalin"),
-            QStringLiteral("mergeral"), QStringLiteral("descgeral"), QStringLiteral("ivageral"),
+    return {QStringLiteral("valor"),     QStringLiteral("iva"),       QStringLiteral("desc"),
+            QStringLiteral("merlin"),    QStringLiteral("desclin"),   QStringLiteral("ivalin"),
+            QStringLiteral("mergeral"),  QStringLiteral("descgeral"), QStringLiteral("ivageral"),
             QStringLiteral("totalgeral")};
 }
 
@@ -81,13 +84,6 @@ const QList<Tabela>& tabelasEmpresa() {
         return t;
     }();
     return tabelas;
-}
-
-const Tabela* tabelaEmpresa(QStringView nome) {
-    for (const Tabela& t : tabelasEmpresa()) {
-        if (nome.compare(t.nome, Qt::CaseInsensitive) == 0) return &t;
-    }
-    return nullptr;
 }
 
 }  // namespace brasel::db::schema

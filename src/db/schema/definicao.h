@@ -39,13 +39,14 @@ struct Tabela {
     QList<Coluna> colunas;
     QList<Indice> indices;
     bool umaLinha = false;  // holds exactly one row, created with the table
-
-    const Coluna* coluna(QStringView nome) const;  // case-insensitive, nullptr when absent
 };
+
+// The ten kinds of amount that carry their own decimals and rounding mode, in the order of the
+// column suffixes (cliarre<valor>, Clientes.dec<valor>, ...): valor, iva, desc, merlin, desclin,
+// ivalin, mergeral, descgeral, ivageral, totalgeral.
+QStringList sufixosArredondamento();
 
 // Every table and column of a company database, in creation order.
 const QList<Tabela>& tabelasEmpresa();
-// A table of the definition by name (case-insensitive), nullptr when absent.
-const Tabela* tabelaEmpresa(QStringView nome);
 
 }  // namespace brasel::db::schema

@@ -34,14 +34,14 @@ Tabela paramGeral() {
         .colunas(arredondamentosFamilia(QStringLiteral("for"), sufixosArredondamento()))
         .colunas(arredondamentosFamilia(QStringLiteral("cai"), caixa))
         .inteiro({"banarre", "bandec"})
-        .texto({"MensagCli", "Mensagfor", "Mensagpro", "MensagproPMC", "controlaquant",
-                "docaberto", "Clidiversos", "forndiversos", "proddiversos", "proddiversos2", "Ano",
-                "mes", "controlaano", "controlames"})
+        .texto({"MensagCli", "Mensagfor", "Mensagpro", "MensagproPMC", "controlaquant", "docaberto",
+                "Clidiversos", "forndiversos", "proddiversos", "proddiversos2", "Ano", "mes",
+                "controlaano", "controlames"})
         .inteiro({"GridLine", "ContinuaAdicionar"})
         .texto({"AfectaDep", "AfectaLev"})
         .inteiro({"prontovestir"})
-        .texto({"NomeEstacao", "NomeSexo", "NomeReferencia", "NomeModelo", "NomeCor",
-                "NomeTamanho", "NomeComprimento", "AnoCalculo"})
+        .texto({"NomeEstacao", "NomeSexo", "NomeReferencia", "NomeModelo", "NomeCor", "NomeTamanho",
+                "NomeComprimento", "AnoCalculo"})
         .inteiro({"ImpCabecalhos", "controlespecifico", "controlOficial"})
         // A database this program made or brought up to date is converted.
         .coluna(QStringLiteral("ConverteuNVARCHAR"), Tipo::Inteiro, "1")
@@ -65,8 +65,8 @@ Tabela paramGeral() {
         .texto({"EMail_Recibo", "EMail_Assunto", "EMail_CorpoMensagem"})
         // The company's default warehouse, handed to the posting of open lines.
         .texto({"armazem"})
-        .texto({"TipoSICliD", "TipoSICliC", "TipoSIForD", "TipoSIForC", "TipoSIBanD",
-                "TipoSIBanC", "TipoSIPro", "TipoSICaiD", "TipoSICaiC"})
+        .texto({"TipoSICliD", "TipoSICliC", "TipoSIForD", "TipoSIForC", "TipoSIBanD", "TipoSIBanC",
+                "TipoSIPro", "TipoSICaiD", "TipoSICaiC"})
         .umaLinha();
 }
 
@@ -128,18 +128,16 @@ void acrescentaConfiguracao(QList<Tabela>& t) {
                          "medium_on", "large_on", "large_off", "corte", "cor0", "cor1", "reset",
                          "setinternationalCHR"})
                  .unico({"Codigo"}));
-    t.append(Def("TabDisplay")
-                 .texto({"Codigo", "Descricao"})
-                 .inteiro({"Porta", "NumLetras"})
-                 .texto({"Limpa", "InitMostrador", "InitLinha1", "FimLinha1", "InitLinha2",
-                         "FimLinha2"})
-                 .inteiro({"Alinha1", "Alinha2"})
-                 .unico({"Codigo"}));
+    t.append(
+        Def("TabDisplay")
+            .texto({"Codigo", "Descricao"})
+            .inteiro({"Porta", "NumLetras"})
+            .texto({"Limpa", "InitMostrador", "InitLinha1", "FimLinha1", "InitLinha2", "FimLinha2"})
+            .inteiro({"Alinha1", "Alinha2"})
+            .unico({"Codigo"}));
     t.append(Def("ConfigProd").texto({"TipoSaida", "TipoEnt", "Fornece", "cliente"}));
     t.append(Def("PDocumentos", "Record").texto({"Codigo", "Descricao"}));
-    t.append(Def("pcampos")
-                 .texto({"Documento", "Campo"})
-                 .inteiro({"Linha", "Coluna", "Largura"}));
+    t.append(Def("pcampos").texto({"Documento", "Campo"}).inteiro({"Linha", "Coluna", "Largura"}));
 }
 
 }  // namespace brasel::db::schema

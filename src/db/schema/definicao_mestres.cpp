@@ -41,8 +41,8 @@ Tabela clientes() {
 
 Tabela fornece() {
     return Def("Fornece")
-        .texto({"codigo", "Descricao", "PagaComo", "Morada", "Local", "codpost", "Pais",
-                "Deferencia"})
+        .texto(
+            {"codigo", "Descricao", "PagaComo", "Morada", "Local", "codpost", "Pais", "Deferencia"})
         .inteiro({"condpag"})
         .texto({"Contribuinte"})
         .montante({"desconto1", "desconto2", "desconto3", "DescontoPP"})
@@ -80,8 +80,8 @@ Tabela produtos() {
 Tabela tabTipoMov() {
     return Def("TabTipoMov")
         // UltNumero holds the last number zero-filled to the width of document numbers.
-        .texto({"codigo", "Descricao", "UltNumero", "Modulo", "AfectaCli", "AfectaFor",
-                "AfectaSTK", "AfectaCaixa", "AfectaBan", "AfectaIVA"})
+        .texto({"codigo", "Descricao", "UltNumero", "Modulo", "AfectaCli", "AfectaFor", "AfectaSTK",
+                "AfectaCaixa", "AfectaBan", "AfectaIVA"})
         .inteiro({"GuiaTransp", "ControloHash", "CopiaDocumentoOriginal"})
         .texto({"Autorizacao"})
         .inteiro({"abrecaixa", "Vias"})
@@ -131,10 +131,10 @@ void acrescentaDescontos(QList<Tabela>& t) {
 }  // namespace
 
 void acrescentaMestres(QList<Tabela>& t) {
-    t.append(Def("armazens")
-                 .texto({"codigo", "linha1", "linha2", "linha3", "linha4", "linha5", "linha6",
-                         "linha7"})
-                 .unico({"codigo"}));
+    t.append(
+        Def("armazens")
+            .texto({"codigo", "linha1", "linha2", "linha3", "linha4", "linha5", "linha6", "linha7"})
+            .unico({"codigo"}));
     t.append(tabelaCodigoDescricao("Caixas"));
     t.append(Def("Cambios")
                  .texto({"codigo", "Abreviatura"})
@@ -159,8 +159,8 @@ void acrescentaMestres(QList<Tabela>& t) {
                  .texto({"ProdutoBase", "ProdutoEquivalente"})
                  .inteiro({"Interactividade"}));
     t.append(Def("ProdutosFacturaREST")
-                 .texto({"Codigo", "Produto", "Descricao", "DataInicial", "DataFinal",
-                         "Utilizador", "DataSys"})
+                 .texto({"Codigo", "Produto", "Descricao", "DataInicial", "DataFinal", "Utilizador",
+                         "DataSys"})
                  .unico({"Codigo", "Produto"}));
     t.append(Def("ProdutosImpostos")
                  .texto({"Produto", "Codigo"})
@@ -192,15 +192,12 @@ void acrescentaMestres(QList<Tabela>& t) {
                  .montante({"TaxaInerente", "TaxaCustos"})
                  .unico({"codigo"}));
     t.append(tabTipoMov());
-    t.append(Def("TabSituacao")
-                 .texto({"Codigo", "Descricao"})
-                 .inteiro({"Movimenta"})
-                 .unico({"Codigo"}));
-    for (const char* nome : {"TabGrupoPro", "TabFamPro", "TabSubFamPro", "TabGrupoCli",
-                             "TabFamCli", "TabSubFamCli", "Localizacao", "TabPostal",
-                             "TabVendedor", "TabLotes", "HistoricoOBS", "Delegados", "TabEstacao",
-                             "TabSexo", "Referencias", "Modelos", "Cores", "Tamanhos",
-                             "Comprimentos"}) {
+    t.append(
+        Def("TabSituacao").texto({"Codigo", "Descricao"}).inteiro({"Movimenta"}).unico({"Codigo"}));
+    for (const char* nome :
+         {"TabGrupoPro", "TabFamPro", "TabSubFamPro", "TabGrupoCli", "TabFamCli", "TabSubFamCli",
+          "Localizacao", "TabPostal", "TabVendedor", "TabLotes", "HistoricoOBS", "Delegados",
+          "TabEstacao", "TabSexo", "Referencias", "Modelos", "Cores", "Tamanhos", "Comprimentos"}) {
         t.append(tabelaCodigoDescricao(nome));
     }
     acrescentaDescontos(t);

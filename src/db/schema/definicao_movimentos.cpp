@@ -27,9 +27,9 @@ Def linhasDocumento(const char* nome) {
         .texto({"Armazem", "ArmazemDest", "AfectaCli", "AfectaFor", "AfectaStk", "Caixa", "Aplic",
                 "TipoEncomenda", "NumEncomenda"})
         .coluna(QStringLiteral("RegiEncomenda"), Tipo::Inteiro64)
-        .texto({"TipoGuia", "NumGuia", "DataGuia", "Estacao", "Sexo", "Referencia", "Modelo",
-                "Cor", "Tamanho", "Comprimento", "Fornece", "ObsLinha", "Chave", "ContaContab",
-                "Fechado", "ProdDiversos", "Localizacao", "OutUniCod"})
+        .texto({"TipoGuia", "NumGuia", "DataGuia", "Estacao", "Sexo", "Referencia", "Modelo", "Cor",
+                "Tamanho", "Comprimento", "Fornece", "ObsLinha", "Chave", "ContaContab", "Fechado",
+                "ProdDiversos", "Localizacao", "OutUniCod"})
         .montante({"OutUniQuant"})
         .texto({"ImpTrans", "Cambio"})
         .montante({"ValCambio"})
@@ -71,9 +71,8 @@ Tabela cabecalhoDocumento(const char* nome) {
         .numeradas("TabIva", 4, Tipo::Texto)
         .numeradas("TaxIva", 4, Tipo::Montante)
         .numeradas("IvaIntra", 4, Tipo::Montante)
-        .montante({"Valor", "Desconto", "IVA", "DescFinVal", "DescFinPer",
-                   "DescontoFinanceiroPerc", "DescontoFinanceiro", "TotalDoc", "saldodoc",
-                   "IncidIRS", "ValorIRS"})
+        .montante({"Valor", "Desconto", "IVA", "DescFinVal", "DescFinPer", "DescontoFinanceiroPerc",
+                   "DescontoFinanceiro", "TotalDoc", "saldodoc", "IncidIRS", "ValorIRS"})
         // Cambio: the company's currency code (ParamGeral.cambiodef).
         .texto({"observaext", "Observa", "Carga", "Descarga", "Armazem", "integrou", "Cambio"})
         .montante({"ValCambio"})
