@@ -16,8 +16,14 @@ std::int64_t checked(__int128 value) {
     return static_cast<std::int64_t>(value);
 }
 
-// Divides by a power of ten rounding ties to even.
+}  // namespace
+
 __int128 divideTiesToEven(__int128 value, __int128 divisor) {
+    if (divisor == 0) throw CurrencyOverflow();
+    if (divisor < 0) {
+        value = -value;
+        divisor = -divisor;
+    }
     __int128 quotient = value / divisor;
     __int128 remainder = value % divisor;
     if (remainder < 0) remainder = -remainder;
@@ -28,9 +34,13 @@ __int128 divideTiesToEven(__int128 value, __int128 divisor) {
     return quotient;
 }
 
-// Reads [sign]digits[.digits][e[sign]digits] into ten-thousandths, ties to even beyond four
-// decimals. Returns false on anything else.
-bool parseDecimal(std::string_view text, std::int64_t& out) {
+namespace {
+
+constexpr __int128 kInt128Max = ~static_cast<unsigned __int128>(0) >> 1;
+
+// Reads [sign]digits[.digits][e[sign]digits] into units of 10^-decimals, ties to even beyond
+// them. Returns false on anything else or when the value leaves the 128-bit range.
+bool parseScaled(std::string_view text, int decimals, __int128& out) {
     std::size_t i = 0;
     bool negative = false;
     if (i < text.size() && (text[i] == '+' || text[i] == '-')) negative = text[i++] == '-';
@@ -72,12 +82,12 @@ bool parseDecimal(std::string_view text, std::int64_t& out) {
     } else if (i != text.size()) {
         return false;
     }
-    // value = mantissa * 10^(exponent - scale); we want it * 10^4.
-    int shift = exponent - scale + 4;
+    // value = mantissa * 10^(exponent - scale); we want it * 10^decimals.
+    int shift = exponent - scale + decimals;
     if (shift >= 0) {
         for (int k = 0; k < shift; ++k) {
+            if (mantissa > kInt128Max / 10) return false;
             mantissa *= 10;
-            if (mantissa > static_cast<__int128>(kMax) + 1) return false;
         }
     } else {
         if (shift < -36) {
@@ -94,10 +104,50 @@ bool parseDecimal(std::string_view text, std::int64_t& out) {
             mantissa = quotient;
         }
     }
-    if (negative) mantissa = -mantissa;
-    if (mantissa > kMax || mantissa < std::numeric_limits<std::int64_t>::min()) return false;
-    out = static_cast<std::int64_t>(mantissa);
+    out = negative ? -mantissa : mantissa;
     return true;
+}
+
+// Ten-thousandths of decimal text; false when malformed or out of the 64-bit range.
+bool parseDecimal(std::string_view text, std::int64_t& out) {
+    __int128 value = 0;
+    if (!parseScaled(text, 4, value)) return false;
+    if (value > kMax || value < std::numeric_limits<std::int64_t>::min()) return false;
+    out = static_cast<std::int64_t>(value);
+    return true;
+}
+
+// Factors are kept to 18 decimals: enough for any rate or percentage typed or stored, and an
+// amount times one still fits in 128 bits before the division.
+constexpr __int128 kFactorScale = 1'000'000'000'000'000'000;
+
+// A double divided by 10^shift, as the decimal it was written as, in units of 10^-18.
+__int128 factorOf(double value, int shift) {
+    if (!std::isfinite(value)) throw CurrencyOverflow();
+    char buffer[64];
+    auto [end, ec] = std::to_chars(buffer, buffer + sizeof buffer, value);
+    if (ec != std::errc()) throw CurrencyOverflow();
+    __int128 factor = 0;
+    if (!parseScaled(std::string_view(buffer, end - buffer), 18 - shift, factor)) {
+        throw CurrencyOverflow();
+    }
+    return factor;
+}
+
+// raw * numerator / denominator, rounded once. When the product leaves 128 bits the quotient
+// cannot fit 64 bits either (every denominator used here is at most 10^18 times smaller).
+Currency mulDivRound(std::int64_t raw, __int128 numerator, __int128 denominator) {
+    __int128 product = 0;
+    if (__builtin_mul_overflow(static_cast<__int128>(raw), numerator, &product)) {
+        throw CurrencyOverflow();
+    }
+    return Currency::fromRaw(checked(divideTiesToEven(product, denominator)));
+}
+
+__int128 onePlusPercent(double percent) {
+    __int128 sum = 0;
+    if (__builtin_add_overflow(kFactorScale, factorOf(percent, 2), &sum)) throw CurrencyOverflow();
+    return sum;
 }
 
 }  // namespace
@@ -181,6 +231,30 @@ Currency& Currency::operator-=(Currency other) {
 Currency operator*(Currency a, Currency b) {
     const __int128 product = static_cast<__int128>(a.raw_) * b.raw_;
     return Currency::fromRaw(checked(divideTiesToEven(product, Currency::kScale)));
+}
+
+Currency Currency::percentOf(double percent) const {
+    return mulDivRound(raw_, factorOf(percent, 2), kFactorScale);
+}
+
+Currency Currency::withPercent(double percent) const {
+    return mulDivRound(raw_, onePlusPercent(percent), kFactorScale);
+}
+
+Currency Currency::withoutPercent(double percent) const {
+    return mulDivRound(raw_, kFactorScale, onePlusPercent(percent));
+}
+
+Currency Currency::times(double factor) const {
+    return mulDivRound(raw_, factorOf(factor, 0), kFactorScale);
+}
+
+Currency Currency::dividedBy(double divisor) const {
+    return mulDivRound(raw_, kFactorScale, factorOf(divisor, 0));
+}
+
+Currency Currency::mulDiv(Currency a, Currency b, Currency c) {
+    return mulDivRound(a.raw_, b.raw_, c.raw_);
 }
 
 Currency CCur(double value) {

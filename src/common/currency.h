@@ -60,6 +60,20 @@ class Currency {
     // Division yields a double: what follows is a percentage or goes back through CCur.
     friend double operator/(Currency a, Currency b) { return a.toDouble() / b.toDouble(); }
 
+    // Amounts scaled by a percentage or a rate. The double is taken as the decimal it was written
+    // as (its shortest text, kept to 18 decimals) and the product or quotient is computed exactly
+    // before one rounding to four decimals, ties to even: what CCur(amount * factor) means without
+    // the error of carrying the amount in a double. A non-finite factor, a zero divisor or a
+    // result out of range raises CurrencyOverflow.
+    Currency percentOf(double percent) const;       // amount * percent / 100
+    Currency withPercent(double percent) const;     // amount * (1 + percent / 100)
+    Currency withoutPercent(double percent) const;  // amount / (1 + percent / 100)
+    Currency times(double factor) const;            // amount * factor
+    Currency dividedBy(double divisor) const;       // amount / divisor
+    // a * b / c exactly, rounded once to four decimals, ties to even: a share of an amount in
+    // proportion to two others. A zero c raises CurrencyOverflow.
+    static Currency mulDiv(Currency a, Currency b, Currency c);
+
     friend constexpr bool operator==(Currency, Currency) = default;
     friend constexpr std::strong_ordering operator<=>(Currency a, Currency b) {
         return a.raw_ <=> b.raw_;
@@ -68,6 +82,10 @@ class Currency {
   private:
     std::int64_t raw_ = 0;
 };
+
+// value / divisor rounded to a whole number, ties to even: the one rounding of every conversion
+// of amounts. A zero divisor raises CurrencyOverflow.
+__int128 divideTiesToEven(__int128 value, __int128 divisor);
 
 // The currency conversion of a double: four decimals, ties to even, decided on the shortest
 // decimal text of the double so that 1.00005 is a tie and not 1.0000499999. Out of range raises
