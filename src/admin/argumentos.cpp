@@ -37,6 +37,10 @@ const QList<Comando>& comandos() {
           QStringLiteral("password")},
          {},
          {}},
+        {QStringLiteral("add-server"),
+         {QStringLiteral("server")},
+         {QStringLiteral("login"), QStringLiteral("password"), QStringLiteral("auth")},
+         {}},
     };
     return lista;
 }
@@ -101,6 +105,9 @@ QString textoAjuda() {
         "  check         Verifica uma empresa: versão, tabelas e colunas, linhas obrigatórias\n"
         "                e a configuração inicial.\n"
         "                --server S --company CCCC --login L --password P\n"
+        "  add-server    Acrescenta o servidor à lista de empresas deste posto (ou actualiza\n"
+        "                o seu login e password).\n"
+        "                --server S [--login L --password P] [--auth SQL|WIN]\n"
         "\n"
         "Servidor (S): uma pasta ou \"sqlite:<pasta>\" para o motor embutido, ou\n"
         "\"postgresql://máquina[:porta]\" para um servidor PostgreSQL.\n"

@@ -1,10 +1,14 @@
 #include "admin/comandos.h"
 
 #include "admin/verificacao.h"
+#include "app/definicoes_posto.h"
+#include "common/settings_store.h"
 #include "db/demo/restaurante_demo.h"
 #include "db/master_logins.h"
 #include "db/schema/esquema.h"
 #include "db/schema/servidor.h"
+
+#include <algorithm>
 
 namespace brasel::admin {
 
@@ -141,6 +145,44 @@ int carregarDemo(const Pedido& p, const Contexto& c, Consola& consola) {
     return kSucesso;
 }
 
+// Keeps the server in this workstation's company list: the entry of the same server is updated,
+// otherwise the first free one of the twenty is taken.
+int acrescentarServidor(const Pedido& p, Consola& consola) {
+    const QString autenticacao = p.tem(QStringLiteral("auth"))
+                                     ? p.opcao(QStringLiteral("auth")).trimmed().toUpper()
+                                     : QStringLiteral("SQL");
+    if (autenticacao != QStringLiteral("SQL") && autenticacao != QStringLiteral("WIN")) {
+        consola.erros
+            << QStringLiteral("Autenticação inválida: \"%1\" (SQL ou WIN).").arg(autenticacao)
+            << Qt::endl;
+        return kUtilizacao;
+    }
+    app::ListaServidores lista = app::lerServidores();
+    const QString servidor = p.opcao(QStringLiteral("server")).trimmed();
+    auto entrada = std::find_if(lista.begin(), lista.end(), [&](const app::EntradaServidor& e) {
+        return e.servidor.trimmed() == servidor;
+    });
+    if (entrada == lista.end()) {
+        entrada = std::find_if(lista.begin(), lista.end(),
+                               [](const app::EntradaServidor& e) { return !e.emUso(); });
+    }
+    if (entrada == lista.end()) {
+        return falhou(consola,
+                      QStringLiteral("A lista de servidores deste posto já tem vinte entradas."));
+    }
+    entrada->servidor = servidor;
+    entrada->login = p.opcao(QStringLiteral("login"));
+    entrada->definirPassword(p.opcao(QStringLiteral("password")));
+    entrada->tipoAutenticacao = autenticacao;
+    if (!app::gravarServidores(lista)) {
+        return falhou(consola, QStringLiteral("Não foi possível gravar a lista de servidores em ") +
+                                   pastaDefinicoes());
+    }
+    consola.saida << QStringLiteral("Servidor %1 na lista de empresas deste posto.").arg(servidor)
+                  << Qt::endl;
+    return kSucesso;
+}
+
 }  // namespace
 
 int executar(const Pedido& p, Consola& consola) {
@@ -159,6 +201,7 @@ int executar(const Pedido& p, Consola& consola) {
     c.servidor = *servidor;
     c.credenciais = {p.opcao(QStringLiteral("login")), p.opcao(QStringLiteral("password"))};
     if (p.comando == QStringLiteral("create-login")) return criarLogin(p, c, consola);
+    if (p.comando == QStringLiteral("add-server")) return acrescentarServidor(p, consola);
     c.empresa = p.opcao(QStringLiteral("company"));
     if (!db::schema::codigoEmpresaValido(c.empresa)) {
         consola.erros << QStringLiteral(

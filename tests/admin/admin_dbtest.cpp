@@ -1,6 +1,7 @@
 // brasel-admin as a person runs it: its exit codes, its messages and what it leaves in an
 // embedded server folder.
 #include "admin/programa_admin.h"
+#include "app/definicoes_posto.h"
 #include "common/versao.h"
 #include "db/connection.h"
 #include "db/sessao.h"
@@ -198,6 +199,40 @@ TEST_F(Admin, LoginsAndCompaniesNeedAnAdministrator) {
                      QStringLiteral("CHEFE"), QStringLiteral("--password"), QStringLiteral("x")});
     EXPECT_EQ(r.codigo, 1);
     EXPECT_TRUE(r.erros.contains(QStringLiteral("Não foi possível abrir a empresa 0002")));
+}
+
+}  // namespace
+}  // namespace brasel::admin
+
+namespace brasel::admin {
+namespace {
+
+TEST(AdminServidores, AddServerKeepsOneEntryPerServerAndAtMostTwenty) {
+    QTemporaryDir definicoes;
+    qputenv("BRASEL_SETTINGS_DIR", definicoes.path().toUtf8());
+    const auto acrescenta = [](const QString& servidor, const QString& password) {
+        return correrAdmin({QStringLiteral("add-server"), QStringLiteral("--server"), servidor,
+                            QStringLiteral("--login"), QStringLiteral("SUPERVISOR"),
+                            QStringLiteral("--password"), password});
+    };
+    EXPECT_EQ(acrescenta(QStringLiteral("/srv/a"), QStringLiteral("um")).codigo, 0);
+    EXPECT_EQ(acrescenta(QStringLiteral("/srv/a"), QStringLiteral("dois, \"três\"")).codigo, 0);
+    app::ListaServidores lista = app::lerServidores();
+    EXPECT_EQ(lista[0].servidor, QStringLiteral("/srv/a"));
+    EXPECT_EQ(lista[0].password(), QStringLiteral("dois, \"três\""));
+    EXPECT_FALSE(lista[1].emUso());
+    for (int n = 2; n <= 20; ++n) {
+        ASSERT_EQ(acrescenta(QStringLiteral("/srv/%1").arg(n), QStringLiteral("x")).codigo, 0);
+    }
+    const Resultado cheio = acrescenta(QStringLiteral("/srv/21"), QStringLiteral("x"));
+    EXPECT_EQ(cheio.codigo, 1);
+    EXPECT_TRUE(cheio.erros.contains(QStringLiteral("vinte")));
+    EXPECT_EQ(correrAdmin({QStringLiteral("add-server"), QStringLiteral("--server"),
+                           QStringLiteral("/srv/a"), QStringLiteral("--auth"),
+                           QStringLiteral("KERBEROS")})
+                  .codigo,
+              2);
+    qunsetenv("BRASEL_SETTINGS_DIR");
 }
 
 }  // namespace
