@@ -26,8 +26,18 @@ constexpr int kIntervaloVersaoMs = 60 * 1000;
 
 }  // namespace
 
+CatalogoJanelas catalogoPrograma(Estado& estado) {
+    CatalogoJanelas catalogo;
+    (void)estado;
+    return catalogo;
+}
+
 WMenu::WMenu(Estado& estado, QWidget* pai)
-    : QMainWindow(pai), estado_(estado), mensagens_(this), area_(new QMdiArea(this)) {
+    : QMainWindow(pai),
+      estado_(estado),
+      mensagens_(this),
+      catalogo_(catalogoPrograma(estado)),
+      area_(new QMdiArea(this)) {
     setObjectName(QStringLiteral("WMenu"));
     setWindowTitle(QStringLiteral("Brasel"));
     setCentralWidget(area_);

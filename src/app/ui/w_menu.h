@@ -11,6 +11,10 @@
 
 namespace brasel::app {
 
+// Every window the main window opens, for the rights (the full set of a new user's rights is
+// made from it).
+CatalogoJanelas catalogoPrograma(Estado& estado);
+
 // The main window: the frame every working window opens in, with its menu, status bar,
 // background picture and timers. Closing it (or logging off) ends the user's work and asks to
 // go back to the login.
