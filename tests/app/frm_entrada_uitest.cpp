@@ -28,7 +28,7 @@
 
 #include <functional>
 
-namespace brasel::app::ui {
+namespace brasel::app {
 namespace {
 
 using testing::DefinicoesTemporarias;
@@ -270,4 +270,4 @@ TEST_F(JanelasEntrada, SearchFindsByCodeOrName) {
 }
 
 }  // namespace
-}  // namespace brasel::app::ui
+}  // namespace brasel::app

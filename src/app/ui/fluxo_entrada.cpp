@@ -1,6 +1,6 @@
 #include "app/ui/fluxo_entrada.h"
 
-namespace brasel::app::ui {
+namespace brasel::app {
 
 FluxoEntrada::FluxoEntrada(Estado& estado, MessagePort& mensagens, QString linhaComando,
                            QList<JanelaAcesso> janelas, CriaJanelaPrincipal criaPrincipal,
@@ -60,4 +60,4 @@ void FluxoEntrada::mostrarPrincipal() {
     principal_->show();
 }
 
-}  // namespace brasel::app::ui
+}  // namespace brasel::app

@@ -13,7 +13,7 @@
 
 #include <functional>
 
-namespace brasel::app::ui {
+namespace brasel::app {
 
 // The way into the program: company selection, then login, then the main window; closing the
 // main window returns to the login, Cancel in the login to the company selection, and Cancel in
@@ -58,4 +58,4 @@ class FluxoEntrada : public QObject {
     QPointer<QWidget> principal_;
 };
 
-}  // namespace brasel::app::ui
+}  // namespace brasel::app

@@ -12,7 +12,7 @@
 #include <QPushButton>
 #include <QVBoxLayout>
 
-namespace brasel::app::ui {
+namespace brasel::app {
 
 frmLogin::frmLogin(Estado& estado, MessagePort& mensagens, QList<JanelaAcesso> janelas,
                    QWidget* pai)
@@ -118,4 +118,4 @@ void frmLogin::closeEvent(QCloseEvent* evento) {
     evento->accept();
 }
 
-}  // namespace brasel::app::ui
+}  // namespace brasel::app

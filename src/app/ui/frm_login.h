@@ -10,7 +10,7 @@
 class QLabel;
 class QLineEdit;
 
-namespace brasel::app::ui {
+namespace brasel::app {
 
 // The login into the selected company. OK logs in (entrou: the main window follows, this
 // window hides); a refused password is cleared for typing again. Cancel, or closing the window,
@@ -47,4 +47,4 @@ class frmLogin : public QWidget {
     QLineEdit* txtPassword_;
 };
 
-}  // namespace brasel::app::ui
+}  // namespace brasel::app

@@ -17,7 +17,7 @@
 #include <QTreeWidget>
 #include <QVBoxLayout>
 
-namespace brasel::app::ui {
+namespace brasel::app {
 
 namespace {
 
@@ -168,4 +168,4 @@ void frmSelEmpresa::closeEvent(QCloseEvent* evento) {
     evento->accept();
 }
 
-}  // namespace brasel::app::ui
+}  // namespace brasel::app

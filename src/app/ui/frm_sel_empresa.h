@@ -12,7 +12,7 @@ class QLineEdit;
 class QPushButton;
 class QTreeWidget;
 
-namespace brasel::app::ui {
+namespace brasel::app {
 
 // The company selection: the companies of the listed servers, with the year and name filters,
 // the search and the server maintenance. OK enters the chosen company (empresaEscolhida: the
@@ -57,4 +57,4 @@ class frmSelEmpresa : public QWidget {
     QTreeWidget* lvwEmpresas_;
 };
 
-}  // namespace brasel::app::ui
+}  // namespace brasel::app

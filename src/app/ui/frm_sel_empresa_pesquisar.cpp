@@ -12,7 +12,7 @@
 #include <QTreeWidget>
 #include <QVBoxLayout>
 
-namespace brasel::app::ui {
+namespace brasel::app {
 
 namespace {
 
@@ -84,4 +84,4 @@ int frmSelEmpresaPesquisar::escolhida() const {
     return item ? item->data(0, kPapelIndice).toInt() : -1;
 }
 
-}  // namespace brasel::app::ui
+}  // namespace brasel::app

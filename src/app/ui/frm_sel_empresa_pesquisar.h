@@ -8,7 +8,7 @@
 class QLineEdit;
 class QTreeWidget;
 
-namespace brasel::app::ui {
+namespace brasel::app {
 
 // Search within the company list by code or name: the rows that match what is typed; OK (or a
 // double touch) chooses one.
@@ -29,4 +29,4 @@ class frmSelEmpresaPesquisar : public QDialog {
     QTreeWidget* lvwResultado_;
 };
 
-}  // namespace brasel::app::ui
+}  // namespace brasel::app

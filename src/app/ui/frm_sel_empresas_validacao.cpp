@@ -15,7 +15,7 @@
 #include <QTreeWidget>
 #include <QVBoxLayout>
 
-namespace brasel::app::ui {
+namespace brasel::app {
 
 namespace {
 
@@ -211,4 +211,4 @@ void frmSelEmpresas_Validacao::importar(const QString& ficheiro) {
     mostrarLista();
 }
 
-}  // namespace brasel::app::ui
+}  // namespace brasel::app

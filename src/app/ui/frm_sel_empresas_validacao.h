@@ -9,7 +9,7 @@ class QLineEdit;
 class QRadioButton;
 class QTreeWidget;
 
-namespace brasel::app::ui {
+namespace brasel::app {
 
 // The server list of the workstation: add, change and delete entries, import the list of an
 // older installation, and save. Nothing is stored until Save, which closes the window accepted.
@@ -46,4 +46,4 @@ class frmSelEmpresas_Validacao : public QDialog {
     QRadioButton* optWIN_;
 };
 
-}  // namespace brasel::app::ui
+}  // namespace brasel::app

@@ -2,7 +2,7 @@
 
 #include <QHeaderView>
 
-namespace brasel::app::ui {
+namespace brasel::app {
 
 namespace {
 
@@ -22,4 +22,4 @@ void ajustaColunasTactil(QTreeWidget* lista, int colunaElastica) {
     }
 }
 
-}  // namespace brasel::app::ui
+}  // namespace brasel::app

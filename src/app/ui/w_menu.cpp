@@ -3,7 +3,10 @@
 #include "app/actualizador.h"
 #include "app/definicoes_posto.h"
 #include "app/menu_principal.h"
+#include "app/ui/a_configura_rest.h"
 #include "app/ui/acessos_janela.h"
+#include "app/ui/frm_acessos.h"
+#include "app/ui/frm_muda_utilizador.h"
 #include "app/verifica_versao.h"
 #include "common/ui/estilo_tactil.h"
 #include "common/versao.h"
@@ -16,6 +19,9 @@
 #include <QPrintDialog>
 #include <QPrinter>
 #include <QStatusBar>
+#include <QToolBar>
+
+#include <memory>
 
 namespace brasel::app {
 
@@ -26,9 +32,20 @@ constexpr int kIntervaloVersaoMs = 60 * 1000;
 
 }  // namespace
 
-CatalogoJanelas catalogoPrograma(Estado& estado) {
+CatalogoJanelas catalogoPrograma(Estado& estado, MessagePort& mensagens) {
     CatalogoJanelas catalogo;
-    (void)estado;
+    catalogo.registar(QStringLiteral("Configurações"),
+                      [&estado, &mensagens](QWidget* pai) -> QWidget* {
+                          return new AConfiguraRest(estado, mensagens, pai);
+                      });
+    catalogo.registar(
+        QStringLiteral("Acessos dos Utilizadores"),
+        [&estado, &mensagens](QWidget* pai) -> QWidget* {
+            return new frmAcessos(
+                estado, mensagens,
+                [&estado, &mensagens] { return catalogoPrograma(estado, mensagens).descricoes(); },
+                pai);
+        });
     return catalogo;
 }
 
@@ -36,7 +53,7 @@ WMenu::WMenu(Estado& estado, QWidget* pai)
     : QMainWindow(pai),
       estado_(estado),
       mensagens_(this),
-      catalogo_(catalogoPrograma(estado)),
+      catalogo_(catalogoPrograma(estado, mensagens_)),
       area_(new QMdiArea(this)) {
     setObjectName(QStringLiteral("WMenu"));
     setWindowTitle(QStringLiteral("Brasel"));
@@ -49,6 +66,7 @@ WMenu::WMenu(Estado& estado, QWidget* pai)
         statusBar()->addPermanentWidget(painel, i == 0 ? 2 : 1);
         paineis_.append(painel);
     }
+    statusBar()->setSizeGripEnabled(false);
     criarMenu();
     aplicaFonteTactil(this);
     connect(&relogio_, &QTimer::timeout, this, &WMenu::actualizaBarraEstado);
@@ -56,18 +74,31 @@ WMenu::WMenu(Estado& estado, QWidget* pai)
 }
 
 void WMenu::criarMenu() {
-    auto accao = [this](QMenu* menu, const char* nome, const QString& texto, auto&& fazer) {
+    // Every entry is also a large button of the touch bar: one action serves both.
+    auto* barra = addToolBar(QStringLiteral("Menu"));
+    barra->setObjectName(QStringLiteral("barraTactil"));
+    barra->setMovable(false);
+    barra->setToolButtonStyle(Qt::ToolButtonTextOnly);
+    auto accao = [this, barra](QMenu* menu, const char* nome, const QString& texto, auto&& fazer) {
         QAction* a = menu->addAction(texto);
         a->setObjectName(QLatin1String(nome));
         connect(a, &QAction::triggered, this, fazer);
+        barra->addAction(a);
+        if (QWidget* botao = barra->widgetForAction(a)) botao->setMinimumSize(150, 64);
         return a;
     };
     QMenu* utilitarios = menuBar()->addMenu(QStringLiteral("&Utilitários"));
     utilitarios->setObjectName(QStringLiteral("mnuUtilitarios"));
+    accao(utilitarios, "DefBott_Fonte", QStringLiteral("&Configurações..."),
+          [this] { configurar(); });
+    accao(utilitarios, "mnuAcessos", QStringLiteral("&Acessos dos Utilizadores..."),
+          [this] { editarAcessos(); });
     accao(utilitarios, "mnuDefImpressorass", QStringLiteral("Definir &Impressora..."),
           [this] { configurarImpressora(); });
     QMenu* utilizador = menuBar()->addMenu(QStringLiteral("U&tilizador"));
     utilizador->setObjectName(QStringLiteral("mnuUtilizador"));
+    accao(utilizador, "AlterarUtil", QStringLiteral("&Alterar Utilizador..."),
+          [this] { mudarUtilizador(); });
     accao(utilizador, "LogOff", QStringLiteral("&Terminar Sessão"), [this] { close(); });
     QMenu* ajuda = menuBar()->addMenu(QStringLiteral("A&juda"));
     ajuda->setObjectName(QStringLiteral("mnuAjuda"));
@@ -77,6 +108,14 @@ void WMenu::criarMenu() {
 bool WMenu::carregar() {
     if (!carregarMenuPrincipal(estado_, mensagens_)) return false;
     aplicaCorFundo(this, estado_.gUtilizador);
+    // The menu and the touch bar stand on the user's colour: their texts are light.
+    for (QWidget* barra :
+         {static_cast<QWidget*>(menuBar()), findChild<QWidget*>(QStringLiteral("barraTactil"))}) {
+        QPalette paleta = barra->palette();
+        paleta.setColor(QPalette::ButtonText, Qt::white);
+        paleta.setColor(QPalette::WindowText, Qt::white);
+        barra->setPalette(paleta);
+    }
     aplicaFundo();
     actualizaBarraEstado();
     relogio_.start(1000);
@@ -102,6 +141,33 @@ bool WMenu::abrirJanela(QWidget* janela, const QString& caption) {
     QMdiSubWindow* sub = area_->addSubWindow(janela);
     sub->show();
     return true;
+}
+
+bool WMenu::abrirDialogo(QDialog* dialogo, const QString& caption) {
+    const std::unique_ptr<QDialog> dono(dialogo);
+    if (!verificarAcesso(estado_, dialogo, caption, mensagens_)) return false;
+    dialogo->exec();
+    return true;
+}
+
+void WMenu::configurar() {
+    auto* janela = new AConfiguraRest(estado_, mensagens_, this);
+    connect(janela, &AConfiguraRest::configuracaoGravada, this, &WMenu::aplicaFundo);
+    abrirDialogo(janela, QStringLiteral("Configurações"));
+}
+
+void WMenu::editarAcessos() {
+    abrirDialogo(new frmAcessos(
+                     estado_, mensagens_, [this] { return catalogo_.descricoes(); }, this),
+                 QStringLiteral("Acessos dos Utilizadores"));
+}
+
+void WMenu::mudarUtilizador() {
+    frmMudaUtilizador janela(estado_, mensagens_, this);
+    if (janela.Muda_de_Utilizador()) {
+        aplicaCorFundo(this, estado_.gUtilizador);
+        actualizaBarraEstado();
+    }
 }
 
 void WMenu::actualizaBarraEstado() {

@@ -4,6 +4,7 @@
 #include "app/ui/catalogo_janelas.h"
 #include "common/ui/mensagens_janela.h"
 
+#include <QDialog>
 #include <QLabel>
 #include <QMainWindow>
 #include <QMdiArea>
@@ -13,7 +14,7 @@ namespace brasel::app {
 
 // Every window the main window opens, for the rights (the full set of a new user's rights is
 // made from it).
-CatalogoJanelas catalogoPrograma(Estado& estado);
+CatalogoJanelas catalogoPrograma(Estado& estado, MessagePort& mensagens);
 
 // The main window: the frame every working window opens in, with its menu, status bar,
 // background picture and timers. Closing it (or logging off) ends the user's work and asks to
@@ -31,6 +32,8 @@ class WMenu : public QMainWindow {
     // Shows a window inside the frame after its access check; false (and the window deleted)
     // when refused.
     bool abrirJanela(QWidget* janela, const QString& caption);
+    // The same for a dialog, shown modally.
+    bool abrirDialogo(QDialog* dialogo, const QString& caption);
 
   Q_SIGNALS:
     // The main window closed: the user's work ended, the login comes back.
@@ -46,6 +49,9 @@ class WMenu : public QMainWindow {
     void aplicaFundo();
     void acercaDe();
     void configurarImpressora();
+    void configurar();
+    void editarAcessos();
+    void mudarUtilizador();
 
     Estado& estado_;
     MensagensJanela mensagens_;

@@ -1,0 +1,96 @@
+// The kitchen queue on a PostgreSQL company, where every bound value must find its column's type
+// (a quantity as decimal text, a key as a number) and a note's quotes stay text.
+#include "db/connections.h"
+#include "db/schema/servidor.h"
+#include "pos/cozinha/historico_copa.h"
+#include "pos/cozinha/pedidos_cozinha.h"
+#include "support/impressao_qt.h"
+#include "support/mensagens_gravadas.h"
+#include "support/servidor_pg.h"
+
+#include <QCoreApplication>
+
+#include <gtest/gtest.h>
+
+namespace brasel::pos::cozinha {
+namespace {
+
+class SemEditor : public EditorTexto {
+  public:
+    std::optional<QString> editar(const QString&) override { return std::nullopt; }
+};
+
+class HistoricoCopaPg : public ::testing::Test {
+  protected:
+    void SetUp() override {
+        const auto pg = testing::servidorPg();
+        if (!pg) GTEST_SKIP() << "BRASEL_TEST_PG não definido";
+        texto_ = pg->servidor;
+        servidor_ = db::ServerAddress::parse(texto_).value_or(db::ServerAddress{});
+        admin_ = {pg->login, pg->password};
+        empresa_ = QStringLiteral("K%1").arg(QCoreApplication::applicationPid() % 1000, 3, 10,
+                                             QLatin1Char('0'));
+        QString erro;
+        ASSERT_TRUE(db::schema::criarEmpresa(servidor_, admin_, empresa_, {}, &erro))
+            << erro.toStdString();
+        criada_ = true;
+        ASSERT_TRUE(db::schema::abrirEmpresa(estado_.gConn, servidor_, admin_, empresa_, &erro))
+            << erro.toStdString();
+        ASSERT_TRUE(estado_.gConn.exec(
+            QStringLiteral("insert into Clientes (Codigo, Descricao) values ('M01','Mesa 1')")));
+    }
+
+    void TearDown() override {
+        estado_.gConn.close();
+        if (!criada_) return;
+        db::Connection master;
+        QString password = admin_.password;
+        if (db::Abre_Connexao(master, texto_, QStringLiteral("Master"), admin_.login, password, {},
+                              QStringLiteral("SQL"), 30, 10, true)) {
+            master.exec(QStringLiteral("DROP DATABASE IF EXISTS %1 WITH (FORCE)")
+                            .arg(db::nomeBaseDados(empresa_).toLower()));
+        }
+    }
+
+    QString texto_;
+    db::ServerAddress servidor_;
+    db::schema::Credenciais admin_;
+    QString empresa_;
+    bool criada_ = false;
+    db::Sessao estado_;
+};
+
+TEST_F(HistoricoCopaPg, AQueuedRowIsListedReleasedAndReadBackForPrinting) {
+    PedidoCozinha p{
+        QStringLiteral("BIT"), QStringLiteral("Bitoque d'Ouro"),        *Currency::parse(u"1.5"),
+        QStringLiteral("M01"), QStringLiteral("sem 'sal' -- \"nada\""), QStringLiteral("ANA")};
+    EXPECT_FALSE(ExistemPedidosPorLibertar(estado_));
+    ASSERT_TRUE(MetePedidoCozinha(estado_, p)) << estado_.gConn.lastError().toStdString();
+    ASSERT_TRUE(MeteAnulacaoCozinha(estado_, p));
+    EXPECT_TRUE(ExistemPedidosPorLibertar(estado_));
+
+    const auto fila = PedidosPorLibertar(estado_);
+    ASSERT_TRUE(fila) << estado_.gConn.lastError().toStdString();
+    ASSERT_EQ(fila->size(), 2);
+    EXPECT_EQ(fila->at(0).descricao, p.descricao);
+    EXPECT_EQ(fila->at(0).quantidade, p.quantidade);
+    EXPECT_EQ(fila->at(0).descricaoMesa, QStringLiteral("Mesa 1"));
+    EXPECT_EQ(fila->at(0).obs + QStringLiteral("|") + fila->at(1).obs, p.obs + QStringLiteral("|"));
+    EXPECT_NE(fila->at(0).anulacao, fila->at(1).anulacao);
+
+    testing::MensagensGravadas mensagens;
+    mensagens.respostaFinal = true;
+    SemEditor editor;
+    PedidosCozinha pedidos(estado_, mensagens, editor);
+    ASSERT_TRUE(pedidos.liberta({fila->at(0).numRegisto, fila->at(1).numRegisto}, false));
+    EXPECT_FALSE(ExistemPedidosPorLibertar(estado_));
+    const auto libertados = PedidosLibertados(estado_);
+    ASSERT_TRUE(libertados);
+    ASSERT_EQ(libertados->size(), 2);
+    for (const PedidoCopa& l : *libertados)
+        EXPECT_TRUE(ApagaPedidoImpresso(estado_, l.numRegisto));
+    EXPECT_TRUE(PedidosLibertados(estado_)->isEmpty());
+}
+
+}  // namespace
+}  // namespace brasel::pos::cozinha
