@@ -25,9 +25,11 @@ else
 fi
 
 # Config.cfg: data folder, signing-key file, certificate number, serial-port map, update folder.
-[ -f "$run/portas.cfg" ] || printf '# COMn=/dev/caminho (por omissão COMn é /dev/ttyS<n-1>)\n' > "$run/portas.cfg"
+# The port map is the device simulator's: COM1 the ticket printer, COM2 the customer display.
+dispositivos="$run/dispositivos"
+mkdir -p "$dispositivos"
 printf '%s\r\n%s\r\n%s\r\n%s\r\n%s\r\n' "$dados" "$run/chave-assinatura.txt" "0000/AT" \
-    "$run/portas.cfg" "$run/actualizacoes" > "$run/Config.cfg"
+    "$dispositivos/portas.cfg" "$run/actualizacoes" > "$run/Config.cfg"
 
 if [ ! -f "$dados/Vendrola0001.sqlite" ]; then
     say "A criar a empresa de demonstração 0001..."
@@ -43,6 +45,7 @@ Restaurante de demonstração do Brasel
 Empresa 0001 no servidor embutido: $dados
 Definições do posto: $BRASEL_SETTINGS_DIR
 Config.cfg: $run/Config.cfg
+Dispositivos simulados (impressora COM1, mostrador COM2): $dispositivos
 
 Utilizadores (todos com a password "$password"):
   SUPERVISOR  supervisor (código 01)
@@ -55,5 +58,13 @@ if [ -z "${DISPLAY:-}" ] && [ -z "${WAYLAND_DISPLAY:-}" ] && [ -z "${QT_QPA_PLAT
     say "Não há ecrã gráfico nesta sessão: corra ./brasel.sh demo numa sessão gráfica, ou com um ecrã virtual: xvfb-run -a ./brasel.sh demo"
     exit 0
 fi
+# The simulated printer and display live as long as the program.
+"$build/tools/devsim/devsim" --pasta "$dispositivos" --servidor "$dados" --empresa 0001 \
+    --login SUPERVISOR --password "$password" --impressora COM1:EP1 --display COM2 \
+    > "$dispositivos/devsim.log" 2>&1 &
+devsim_pid=$!
+trap 'kill $devsim_pid 2>/dev/null || true' EXIT
+for _ in $(seq 50); do [ -s "$dispositivos/portas.cfg" ] && break; sleep 0.1; done
+say "Dispositivos simulados: talões em $dispositivos/COM1.txt, mostrador em $dispositivos/COM2.txt"
 say "A abrir o Brasel..."
-exec "$brasel" --config "$run/Config.cfg"
+"$brasel" --config "$run/Config.cfg"

@@ -64,6 +64,7 @@ QString TextoAte(const QString& texto, QChar c) {
 
 MapaPortas MapaPortas::ler(const QString& ficheiro) {
     MapaPortas mapa;
+    if (ficheiro.isEmpty()) return mapa;
     QFile f(ficheiro);
     if (!f.open(QIODevice::ReadOnly | QIODevice::Text)) return mapa;
     static const QRegularExpression linhaPorta(QStringLiteral("^\\s*COM(\\d+)\\s*=\\s*(.*?)\\s*$"),

@@ -4,8 +4,12 @@
 #include "app/ui/frm_acessos.h"
 #include "app/ui/w_menu.h"
 #include "db/connections.h"
+#include "devices/definicao_impressora.h"
+#include "display.h"
+#include "impressora.h"
 #include "support/aplicacao_teste.h"
 #include "support/apoio_arranque.h"
+#include "support/devsim_teste.h"
 #include "support/empresa_teste.h"
 #include "support/impressao_qt.h"
 #include "support/janelas_teste.h"
@@ -111,6 +115,32 @@ TEST_F(MenuPrincipal, LogOffEndsTheWorkOfTheUser) {
                   ->value(0)
                   .toInt(),
               0);
+}
+
+TEST_F(MenuPrincipal, DisplayGreetsAndSaysGoodbyeAndTheDrawerOpensFromTheMenu) {
+    Estado& e = empresa.estado();
+    testing::DevsimTeste devsim;
+    const auto definicao = devices::LerDefinicaoImpressora(e.gConn, QStringLiteral("EP1"));
+    ASSERT_TRUE(definicao);
+    auto& impressora = devsim.liga(definicao->porta,
+                                   std::make_shared<devsim::ImpressoraTalao>(definicao->codigos));
+    auto& display = devsim.liga(2, std::make_shared<devsim::Display>());
+    devsim.aplica(e);
+    auto* menu = new WMenu(e);
+    ASSERT_TRUE(menu->carregar());
+    EXPECT_TRUE(
+        display.espera([](const QByteArray& b) { return b.contains("Aguarde Por Favor"); }, 3000));
+    accao(*menu, "mnuAbreCaixa")->trigger();
+    const QByteArray gaveta = definicao->codigos.abrirCaixa;
+    EXPECT_TRUE(
+        impressora.espera([&gaveta](const QByteArray& b) { return b.contains(gaveta); }, 3000))
+        << impressora.transcricao().toStdString();
+    menu->show();
+    accao(*menu, "LogOff")->trigger();
+    EXPECT_TRUE(
+        display.espera([](const QByteArray& b) { return b.contains("< ENCERRADO >"); }, 3000))
+        << display.transcricao().toStdString();
+    delete menu;
 }
 
 }  // namespace

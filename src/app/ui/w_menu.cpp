@@ -1,6 +1,7 @@
 #include "app/ui/w_menu.h"
 
 #include "app/actualizador.h"
+#include "app/config_cfg.h"
 #include "app/definicoes_posto.h"
 #include "app/menu_principal.h"
 #include "app/ui/a_configura_rest.h"
@@ -10,6 +11,8 @@
 #include "app/verifica_versao.h"
 #include "common/ui/estilo_tactil.h"
 #include "common/versao.h"
+#include "devices/gaveta.h"
+#include "devices/mostra_no_display.h"
 
 #include <QCloseEvent>
 #include <QMdiSubWindow>
@@ -54,7 +57,9 @@ WMenu::WMenu(Estado& estado, QWidget* pai)
       estado_(estado),
       mensagens_(this),
       catalogo_(catalogoPrograma(estado, mensagens_)),
-      area_(new QMdiArea(this)) {
+      area_(new QMdiArea(this)),
+      linha_(MapaPortas::ler(estado.config.mapaPortas)),
+      cozinha_(estado, linha_, mensagens_) {
     setObjectName(QStringLiteral("WMenu"));
     setWindowTitle(QStringLiteral("Brasel"));
     setCentralWidget(area_);
@@ -71,6 +76,8 @@ WMenu::WMenu(Estado& estado, QWidget* pai)
     aplicaFonteTactil(this);
     connect(&relogio_, &QTimer::timeout, this, &WMenu::actualizaBarraEstado);
     connect(&versao_, &QTimer::timeout, this, &WMenu::verificaVersao);
+    pedidos_.setObjectName(QStringLiteral("tmrPedidos"));
+    connect(&pedidos_, &QTimer::timeout, this, [this] { cozinha_.tmrPedidos_Timer(); });
 }
 
 void WMenu::criarMenu() {
@@ -93,6 +100,7 @@ void WMenu::criarMenu() {
           [this] { configurar(); });
     accao(utilitarios, "mnuAcessos", QStringLiteral("&Acessos dos Utilizadores..."),
           [this] { editarAcessos(); });
+    accao(utilitarios, "mnuAbreCaixa", QStringLiteral("Abrir &Gaveta"), [this] { abrirGaveta(); });
     accao(utilitarios, "mnuDefImpressorass", QStringLiteral("Definir &Impressora..."),
           [this] { configurarImpressora(); });
     QMenu* utilizador = menuBar()->addMenu(QStringLiteral("U&tilizador"));
@@ -106,6 +114,7 @@ void WMenu::criarMenu() {
 }
 
 bool WMenu::carregar() {
+    devices::MostraAguardeNoDisplay(estado_, linha_);
     if (!carregarMenuPrincipal(estado_, mensagens_)) return false;
     aplicaCorFundo(this, estado_.gUtilizador);
     // The menu and the touch bar stand on the user's colour: their texts are light.
@@ -120,7 +129,18 @@ bool WMenu::carregar() {
     actualizaBarraEstado();
     relogio_.start(1000);
     versao_.start(kIntervaloVersaoMs);
+    programaCozinha();
     return true;
+}
+
+void WMenu::programaCozinha() {
+    pedidos_.start(posto::ConfigRest_TempoImpTalaoCozinha.ler() * 1000);
+}
+
+void WMenu::abrirGaveta() {
+    devices::AbreGaveta(estado_.gConn, estado_.gUtilizador,
+                        {linha_, posto::ConfigRest_CaixaDinheiro.ler(), QString()}, QString(),
+                        true);
 }
 
 void WMenu::aplicaFundo() {
@@ -152,7 +172,10 @@ bool WMenu::abrirDialogo(QDialog* dialogo, const QString& caption) {
 
 void WMenu::configurar() {
     auto* janela = new AConfiguraRest(estado_, mensagens_, this);
-    connect(janela, &AConfiguraRest::configuracaoGravada, this, &WMenu::aplicaFundo);
+    connect(janela, &AConfiguraRest::configuracaoGravada, this, [this] {
+        aplicaFundo();
+        programaCozinha();
+    });
     abrirDialogo(janela, QStringLiteral("Configurações"));
 }
 
@@ -207,8 +230,10 @@ void WMenu::closeEvent(QCloseEvent* evento) {
     }
     relogio_.stop();
     versao_.stop();
+    pedidos_.stop();
     if (!terminado_) {
         terminado_ = true;
+        devices::MostraEncerradoNoDisplay(estado_, linha_);
         fecharMenuPrincipal(estado_);
         Q_EMIT terminou();
     }

@@ -3,6 +3,8 @@
 #include "app/estado.h"
 #include "app/ui/catalogo_janelas.h"
 #include "common/ui/mensagens_janela.h"
+#include "devices/linha_serie.h"
+#include "pos/cozinha/polling_cozinha.h"
 
 #include <QDialog>
 #include <QLabel>
@@ -28,6 +30,8 @@ class WMenu : public QMainWindow {
     bool carregar();
 
     QMdiArea* area() const { return area_; }
+    // The workstation's one serial control: ticket printer, customer display and drawer.
+    devices::LinhaSerie& linhaSerie() { return linha_; }
     const CatalogoJanelas& catalogo() const { return catalogo_; }
     // Shows a window inside the frame after its access check; false (and the window deleted)
     // when refused.
@@ -52,14 +56,19 @@ class WMenu : public QMainWindow {
     void configurar();
     void editarAcessos();
     void mudarUtilizador();
+    void abrirGaveta();
+    void programaCozinha();
 
     Estado& estado_;
     MensagensJanela mensagens_;
     CatalogoJanelas catalogo_;
     QMdiArea* area_;
     QList<QLabel*> paineis_;
+    devices::LinhaSerie linha_;
+    pos::cozinha::PollingCozinha cozinha_;
     QTimer relogio_;
     QTimer versao_;
+    QTimer pedidos_;
     bool terminado_ = false;
 };
 
