@@ -39,10 +39,17 @@ install_missing() {
         die "apt-get install falhou para: ${missing[*]}"
 }
 
-build() { # build <dir> [cmake options...]
+build() { # build <dir> [cmake options...] [-- targets...]
     local dir="$1"; shift
-    cmake -S . -B "$dir" -G Ninja -DCMAKE_BUILD_TYPE=RelWithDebInfo "$@" >/dev/null
-    cmake --build "$dir" --parallel "$(nproc)"
+    local options=() targets=()
+    while [ $# -gt 0 ] && [ "$1" != "--" ]; do options+=("$1"); shift; done
+    [ "${1:-}" = "--" ] && { shift; targets=("$@"); }
+    cmake -S . -B "$dir" -G Ninja -DCMAKE_BUILD_TYPE=RelWithDebInfo "${options[@]}" >/dev/null
+    if [ ${#targets[@]} -gt 0 ]; then
+        cmake --build "$dir" --parallel "$(nproc)" --target "${targets[@]}"
+    else
+        cmake --build "$dir" --parallel "$(nproc)"
+    fi
 }
 
 # A PostgreSQL cluster of our own in a temporary folder, on a loopback port, owned by postgres.
@@ -92,7 +99,8 @@ cmd_test() {
     say "A correr todos os testes..."
     (cd build && QT_QPA_PLATFORM=offscreen ctest --output-on-failure --parallel "$(nproc)" --timeout 600)
     say "A compilar com AddressSanitizer e UndefinedBehaviorSanitizer (build-asan/)..."
-    build build-asan -DBRASEL_SANITIZE=ON -DBRASEL_BUILD_UI=OFF -DBRASEL_BUILD_BENCH=OFF
+    build build-asan -DCMAKE_BUILD_TYPE=Debug -DBRASEL_SANITIZE=ON -DBRASEL_BUILD_UI=OFF -DBRASEL_BUILD_BENCH=OFF \
+        -- brasel_tests_unit brasel_tests_db brasel-admin
     say "Testes unit e db com sanitizers..."
     (cd build-asan && ASAN_OPTIONS=detect_leaks=0 UBSAN_OPTIONS=print_stacktrace=1:halt_on_error=1 \
         ctest -L '^(unit|db)$' --output-on-failure --parallel "$(nproc)" --timeout 900)
