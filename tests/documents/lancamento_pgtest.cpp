@@ -7,6 +7,7 @@
 #include "documents/preco_medio_custo.h"
 #include "documents/producao.h"
 #include "documents/saldo_produto.h"
+#include "support/empresa_pg.h"
 #include "support/impressao_qt.h"
 #include "support/mensagens_gravadas.h"
 #include "support/servidor_pg.h"
@@ -25,43 +26,16 @@ using teste::movimento;
 class LancamentoPg : public ::testing::Test {
   protected:
     void SetUp() override {
-        const auto pg = testing::servidorPg();
-        if (!pg) GTEST_SKIP() << "BRASEL_TEST_PG não definido";
-        texto_ = pg->servidor;
-        servidor_ = db::ServerAddress::parse(texto_).value_or(db::ServerAddress{});
-        admin_ = {pg->login, pg->password};
-        empresa_ = QStringLiteral("L%1").arg(QCoreApplication::applicationPid() % 1000, 3, 10,
-                                             QLatin1Char('0'));
-        QString erro;
-        ASSERT_TRUE(db::schema::criarEmpresa(servidor_, admin_, empresa_, {}, &erro))
-            << erro.toStdString();
-        criada_ = true;
-        ASSERT_TRUE(db::schema::abrirEmpresa(e.gConn, servidor_, admin_, empresa_, &erro))
-            << erro.toStdString();
+        if (!testing::servidorPg()) GTEST_SKIP() << "BRASEL_TEST_PG não definido";
+        ASSERT_TRUE(empresa_.pronta()) << empresa_.erro().toStdString();
         ASSERT_TRUE(e.gConn.exec(QStringLiteral(
             "insert into Produtos (Codigo, Descricao, ctrlexistencia, precomediocusto, "
             "vendedorhabitual, UnidadeVenda, DiasDevolucao) values "
             "('K1','Vinho d''Ouro',1,'2.5','07','GAR',30)")));
     }
 
-    void TearDown() override {
-        e.gConn.close();
-        if (!criada_) return;
-        db::Connection master;
-        QString password = admin_.password;
-        if (db::Abre_Connexao(master, texto_, QStringLiteral("Master"), admin_.login, password, {},
-                              QStringLiteral("SQL"), 30, 10, true)) {
-            master.exec(QStringLiteral("DROP DATABASE IF EXISTS %1 WITH (FORCE)")
-                            .arg(db::nomeBaseDados(empresa_).toLower()));
-        }
-    }
-
-    QString texto_;
-    db::ServerAddress servidor_;
-    db::schema::Credenciais admin_;
-    QString empresa_;
-    bool criada_ = false;
-    app::Estado e;
+    testing::EmpresaPg empresa_{QLatin1Char('L')};
+    app::Estado& e = empresa_.estado();
 };
 
 TEST_F(LancamentoPg, TheProcedureStoresEveryValueAndTheBalancesCountThem) {

@@ -4,6 +4,7 @@
 #include "db/schema/servidor.h"
 #include "pos/cozinha/historico_copa.h"
 #include "pos/cozinha/pedidos_cozinha.h"
+#include "support/empresa_pg.h"
 #include "support/impressao_qt.h"
 #include "support/mensagens_gravadas.h"
 #include "support/servidor_pg.h"
@@ -23,41 +24,14 @@ class SemEditor : public EditorTexto {
 class HistoricoCopaPg : public ::testing::Test {
   protected:
     void SetUp() override {
-        const auto pg = testing::servidorPg();
-        if (!pg) GTEST_SKIP() << "BRASEL_TEST_PG não definido";
-        texto_ = pg->servidor;
-        servidor_ = db::ServerAddress::parse(texto_).value_or(db::ServerAddress{});
-        admin_ = {pg->login, pg->password};
-        empresa_ = QStringLiteral("K%1").arg(QCoreApplication::applicationPid() % 1000, 3, 10,
-                                             QLatin1Char('0'));
-        QString erro;
-        ASSERT_TRUE(db::schema::criarEmpresa(servidor_, admin_, empresa_, {}, &erro))
-            << erro.toStdString();
-        criada_ = true;
-        ASSERT_TRUE(db::schema::abrirEmpresa(estado_.gConn, servidor_, admin_, empresa_, &erro))
-            << erro.toStdString();
+        if (!testing::servidorPg()) GTEST_SKIP() << "BRASEL_TEST_PG não definido";
+        ASSERT_TRUE(empresa_.pronta()) << empresa_.erro().toStdString();
         ASSERT_TRUE(estado_.gConn.exec(
             QStringLiteral("insert into Clientes (Codigo, Descricao) values ('M01','Mesa 1')")));
     }
 
-    void TearDown() override {
-        estado_.gConn.close();
-        if (!criada_) return;
-        db::Connection master;
-        QString password = admin_.password;
-        if (db::Abre_Connexao(master, texto_, QStringLiteral("Master"), admin_.login, password, {},
-                              QStringLiteral("SQL"), 30, 10, true)) {
-            master.exec(QStringLiteral("DROP DATABASE IF EXISTS %1 WITH (FORCE)")
-                            .arg(db::nomeBaseDados(empresa_).toLower()));
-        }
-    }
-
-    QString texto_;
-    db::ServerAddress servidor_;
-    db::schema::Credenciais admin_;
-    QString empresa_;
-    bool criada_ = false;
-    db::Sessao estado_;
+    testing::EmpresaPg empresa_{QLatin1Char('K')};
+    db::Sessao& estado_ = empresa_.estado();
 };
 
 TEST_F(HistoricoCopaPg, AQueuedRowIsListedReleasedAndReadBackForPrinting) {
