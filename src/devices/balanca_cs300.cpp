@@ -1,5 +1,7 @@
 #include "devices/balanca_cs300.h"
 
+#include "devices/caracteres_controlo.h"
+
 #include <array>
 #include <utility>
 
@@ -7,13 +9,7 @@ namespace brasel::devices {
 
 namespace {
 
-constexpr char EOT = 4;
-constexpr char STX = 2;
-constexpr char ETX = 3;
-constexpr char ENQ = 5;
-constexpr char ACK = 6;
-constexpr char NAK = 21;
-constexpr char ESC = 27;
+using namespace controlo;
 
 // An amount written with `decimais` decimals and no point, left-filled with zeros to `largura`.
 std::optional<QByteArray> campoNumerico(Currency valor, int decimais, int largura) {

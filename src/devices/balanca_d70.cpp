@@ -1,10 +1,12 @@
 #include "devices/balanca_d70.h"
 
+#include "devices/caracteres_controlo.h"
+
 namespace brasel::devices {
 
 namespace {
 
-constexpr char CR = 13;
+using controlo::CR;
 
 bool respostaCompleta(const QByteArray& r) {
     return r.contains(CR);

@@ -1,6 +1,7 @@
 #include "balancas.h"
 
 #include "common/currency.h"
+#include "devices/caracteres_controlo.h"
 
 #include <QMutexLocker>
 
@@ -8,14 +9,7 @@ namespace devsim {
 
 namespace {
 
-constexpr char EOT = 4;
-constexpr char STX = 2;
-constexpr char ETX = 3;
-constexpr char ENQ = 5;
-constexpr char ACK = 6;
-constexpr char NAK = 21;
-constexpr char ESC = 27;
-constexpr char CR = 13;
+using namespace brasel::devices::controlo;
 
 // A decimal option in thousandths (kilograms to grams) or hundredths (euros to cents).
 std::optional<int> decimal(const QString& texto, int divisor) {
