@@ -60,16 +60,17 @@ int main(int argc, char** argv) {
     if (app::LeConfigCfg(estado.config, mensagens, args.config) == app::LeituraConfig::Terminar)
         return 1;
 
-    app::FluxoEntrada fluxo(
-        estado, mensagens, args.linhaComando, app::catalogoPrograma(estado, mensagens).descricoes(),
-        [](app::Estado& e) -> QWidget* {
-            auto* menu = new app::WMenu(e);
-            // A company without its parameters row cannot be worked in: the program ends.
-            if (!menu->carregar()) QTimer::singleShot(0, qApp, [] { QCoreApplication::exit(1); });
-            return menu;
-        });
-    QObject::connect(&fluxo, &app::FluxoEntrada::terminado, &aplicacao,
-                     &QCoreApplication::quit);
+    app::FluxoEntrada fluxo(estado, mensagens, args.linhaComando,
+                            app::catalogoPrograma(estado, mensagens).descricoes(),
+                            [](app::Estado& e) -> QWidget* {
+                                auto* menu = new app::WMenu(e);
+                                // A company without its parameters row cannot be worked in: the
+                                // program ends.
+                                if (!menu->carregar())
+                                    QTimer::singleShot(0, qApp, [] { QCoreApplication::exit(1); });
+                                return menu;
+                            });
+    QObject::connect(&fluxo, &app::FluxoEntrada::terminado, &aplicacao, &QCoreApplication::quit);
     fluxo.iniciar();
     return aplicacao.exec();
 }

@@ -1,12 +1,12 @@
 // The restaurant configuration window offscreen: every control lands in its setting when the
 // window closes, the kitchen poll at once, and a code that does not exist is refused.
 #include "app/definicoes_posto.h"
-#include "support/janelas_teste.h"
 #include "app/ui/a_configura_rest.h"
 #include "support/aplicacao_teste.h"
 #include "support/apoio_arranque.h"
 #include "support/empresa_teste.h"
 #include "support/impressao_qt.h"
+#include "support/janelas_teste.h"
 #include "support/mensagens_gravadas.h"
 
 #include <QButtonGroup>

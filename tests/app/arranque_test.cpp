@@ -1,6 +1,6 @@
 #include "app/arranque.h"
-#include "support/apoio_arranque.h"
 #include "common/versao.h"
+#include "support/apoio_arranque.h"
 
 #include <QDir>
 #include <QFile>

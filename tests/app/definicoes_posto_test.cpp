@@ -1,7 +1,7 @@
 #include "app/definicoes_posto.h"
-#include "support/apoio_arranque.h"
 #include "common/cls_encripta.h"
 #include "common/settings_store.h"
+#include "support/apoio_arranque.h"
 
 #include <QDate>
 #include <QDir>

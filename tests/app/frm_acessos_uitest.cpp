@@ -1,10 +1,10 @@
 // The rights editor offscreen: a user without rights gets them created on request, and a button
 // refused, saved and reloaded stays refused.
-#include "support/janelas_teste.h"
 #include "app/ui/frm_acessos.h"
 #include "support/aplicacao_teste.h"
 #include "support/empresa_teste.h"
 #include "support/impressao_qt.h"
+#include "support/janelas_teste.h"
 #include "support/mensagens_gravadas.h"
 
 #include <QTreeWidget>

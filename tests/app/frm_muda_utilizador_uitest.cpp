@@ -2,7 +2,6 @@
 // and the window keeps its position; the password prompts of the supervisor and of the user
 // confirmation.
 #include "app/definicoes_posto.h"
-#include "support/janelas_teste.h"
 #include "app/ui/frm_confirmacao_utilizador.h"
 #include "app/ui/frm_muda_utilizador.h"
 #include "app/ui/frm_password_supervisor.h"
@@ -10,6 +9,7 @@
 #include "support/apoio_arranque.h"
 #include "support/empresa_teste.h"
 #include "support/impressao_qt.h"
+#include "support/janelas_teste.h"
 #include "support/mensagens_gravadas.h"
 
 #include <QLineEdit>

@@ -1,6 +1,6 @@
 #include "app/instancia_unica.h"
-#include "support/apoio_arranque.h"
 #include "common/settings_store.h"
+#include "support/apoio_arranque.h"
 #include "support/mensagens_gravadas.h"
 
 #include <QDir>

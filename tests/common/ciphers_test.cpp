@@ -1,7 +1,7 @@
-#include "support/apoio_arranque.h"
 #include "common/cls_encripta.h"
 #include "common/ediv.h"
 #include "common/settings_store.h"
+#include "support/apoio_arranque.h"
 
 #include <gtest/gtest.h>
 

@@ -1,8 +1,8 @@
 #include "app/ui/a_configura_rest.h"
 
 #include "app/definicoes_posto.h"
-#include "common/ui/indicadores_tacteis.h"
 #include "common/ui/estilo_tactil.h"
+#include "common/ui/indicadores_tacteis.h"
 #include "lookups/ui/campo_codigo_janela.h"
 
 #include <QColorDialog>

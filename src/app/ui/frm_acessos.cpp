@@ -1,7 +1,7 @@
 #include "app/ui/frm_acessos.h"
 
-#include "common/ui/indicadores_tacteis.h"
 #include "common/ui/estilo_tactil.h"
+#include "common/ui/indicadores_tacteis.h"
 
 #include <QHBoxLayout>
 #include <QHeaderView>

@@ -91,7 +91,7 @@ void WMenu::criarMenu() {
         a->setObjectName(QLatin1String(nome));
         connect(a, &QAction::triggered, this, fazer);
         barra->addAction(a);
-        if (QWidget* botao = barra->widgetForAction(a)) botao->setMinimumSize(150, 64);
+        if (QWidget* botao = barra->widgetForAction(a)) botao->setMinimumHeight(64);
         return a;
     };
     QMenu* utilitarios = menuBar()->addMenu(QStringLiteral("&Utilitários"));
