@@ -6,6 +6,7 @@
 #include "app/ui/fluxo_entrada.h"
 #include "app/ui/w_menu.h"
 #include "common/ui/mensagens_janela.h"
+#include "devices/linha_serie.h"
 
 #include <QApplication>
 #include <QFileInfo>
@@ -60,16 +61,20 @@ int main(int argc, char** argv) {
     if (app::LeConfigCfg(estado.config, mensagens, args.config) == app::LeituraConfig::Terminar)
         return 1;
 
-    app::FluxoEntrada fluxo(estado, mensagens, args.linhaComando,
-                            app::catalogoPrograma(estado, mensagens).descricoes(),
-                            [](app::Estado& e) -> QWidget* {
-                                auto* menu = new app::WMenu(e);
-                                // A company without its parameters row cannot be worked in: the
-                                // program ends.
-                                if (!menu->carregar())
-                                    QTimer::singleShot(0, qApp, [] { QCoreApplication::exit(1); });
-                                return menu;
-                            });
+    // The windows built to describe their buttons for a new user's rights never open a port.
+    devices::LinhaSerie linhaDescricoes;
+    app::FluxoEntrada fluxo(
+        estado, mensagens, args.linhaComando,
+        [&estado, &mensagens, &linhaDescricoes] {
+            return app::catalogoPrograma(estado, mensagens, linhaDescricoes).descricoes();
+        },
+        [](app::Estado& e) -> QWidget* {
+            auto* menu = new app::WMenu(e);
+            // A company without its parameters row cannot be worked in: the
+            // program ends.
+            if (!menu->carregar()) QTimer::singleShot(0, qApp, [] { QCoreApplication::exit(1); });
+            return menu;
+        });
     QObject::connect(&fluxo, &app::FluxoEntrada::terminado, &aplicacao, &QCoreApplication::quit);
     fluxo.iniciar();
     return aplicacao.exec();

@@ -142,10 +142,11 @@ bool gravarDireitos(Estado& estado, const QString& utilizador,
     return tx.commit();
 }
 
-bool acessoPrograma(Estado& estado, const QString& utilizador, const QList<JanelaAcesso>& janelas) {
+bool acessoPrograma(Estado& estado, const QString& utilizador, const FornecedorJanelas& janelas) {
     if (utilizadorSemRestricoes(utilizador)) return true;
-    if (!CheckUtilizApp(estado, kPrograma, utilizador))
-        CriaTodososAcessos(estado, utilizador, janelas);
+    if (!CheckUtilizApp(estado, kPrograma, utilizador)) {
+        CriaTodososAcessos(estado, utilizador, janelas ? janelas() : QList<JanelaAcesso>{});
+    }
     return CheckUtilizApp(estado, kPrograma, utilizador) == 1;
 }
 

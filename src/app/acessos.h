@@ -6,6 +6,7 @@
 #include <QMap>
 #include <QString>
 
+#include <functional>
 #include <optional>
 
 namespace brasel::app {
@@ -75,8 +76,11 @@ QList<DireitoAcesso> lerDireitos(Estado& estado, const QString& utilizador);
 bool gravarDireitos(Estado& estado, const QString& utilizador,
                     const QList<DireitoAcesso>& direitos);
 
+// The program's windows as the rights see them, made only when a user's rights must be created.
+using FornecedorJanelas = std::function<QList<JanelaAcesso>()>;
+
 // Whether a user may run the program: users without restrictions always; others by the program
 // right, created granted with every window's rights when the user has none yet.
-bool acessoPrograma(Estado& estado, const QString& utilizador, const QList<JanelaAcesso>& janelas);
+bool acessoPrograma(Estado& estado, const QString& utilizador, const FornecedorJanelas& janelas);
 
 }  // namespace brasel::app

@@ -63,7 +63,7 @@ void fecharLigacoes(Estado& estado) {
 }
 
 ResultadoLogin validarLogin(Estado& estado, const QString& nomeEscrito, const QString& password,
-                            const QList<JanelaAcesso>& janelas, MessagePort& mensagens) {
+                            const FornecedorJanelas& janelas, MessagePort& mensagens) {
     const QString nome = nomeEscrito.trimmed().toUpper();
     // Nobody is logged in until this login succeeds.
     estado.gUtilizador.clear();

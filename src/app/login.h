@@ -22,7 +22,7 @@ enum class ResultadoLogin {
 // none yet. On success the user is marked in use (UsoPOS) and the name typed is kept for the
 // next login; on failure no connection is left open.
 ResultadoLogin validarLogin(Estado& estado, const QString& nomeEscrito, const QString& password,
-                            const QList<JanelaAcesso>& janelas, MessagePort& mensagens);
+                            const FornecedorJanelas& janelas, MessagePort& mensagens);
 
 // What the login window starts with.
 struct AberturaLogin {

@@ -102,7 +102,7 @@ TEST(Acessos, ProgramRightEditorAndDeletion) {
     Estado& e = empresa.estado();
     const QString u = QStringLiteral("03");
     ApagaTodososAcessos(e, u);
-    EXPECT_TRUE(acessoPrograma(e, u, {kJanela}));
+    EXPECT_TRUE(acessoPrograma(e, u, [] { return QList<JanelaAcesso>{kJanela}; }));
     EXPECT_EQ(CheckUtilizApp(e, kPrograma, u), 1);
     EXPECT_EQ(contaLinhas(e, u), 4);
 
@@ -112,7 +112,7 @@ TEST(Acessos, ProgramRightEditorAndDeletion) {
     for (DireitoAcesso& d : direitos)
         d.valor = d.chave == kPrograma ? false : d.valor;
     EXPECT_TRUE(gravarDireitos(e, u, direitos));
-    EXPECT_FALSE(acessoPrograma(e, u, {kJanela}));
+    EXPECT_FALSE(acessoPrograma(e, u, [] { return QList<JanelaAcesso>{kJanela}; }));
     EXPECT_FALSE(gravarDireitos(e, QStringLiteral("00"), direitos));
 
     ApagaTodososAcessos(e, u);

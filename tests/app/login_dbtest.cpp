@@ -163,7 +163,9 @@ TEST_F(Login, ProgramRightDecidesAndIsCreatedForANewUser) {
         const JanelaAcesso janela{QStringLiteral("frmFacturacao"),
                                   QStringLiteral("Facturação"),
                                   {{QStringLiteral("cmdGravarDoc"), QStringLiteral("&Gravar")}}};
-        EXPECT_EQ(validarLogin(e, QStringLiteral("rui"), EmpresaTeste::password(), {janela}, m),
+        EXPECT_EQ(validarLogin(
+                      e, QStringLiteral("rui"), EmpresaTeste::password(),
+                      [&janela] { return QList<JanelaAcesso>{janela}; }, m),
                   ResultadoLogin::Entrou);
         EXPECT_EQ(campo(e, "select value from acessos where utilizador='03' and chave='Brasel'"),
                   QStringLiteral("1"));

@@ -3,7 +3,7 @@
 namespace brasel::app {
 
 FluxoEntrada::FluxoEntrada(Estado& estado, MessagePort& mensagens, QString linhaComando,
-                           QList<JanelaAcesso> janelas, CriaJanelaPrincipal criaPrincipal,
+                           FornecedorJanelas janelas, CriaJanelaPrincipal criaPrincipal,
                            QObject* pai)
     : QObject(pai),
       estado_(estado),

@@ -28,7 +28,7 @@ class FluxoEntrada : public QObject {
     using CriaJanelaPrincipal = std::function<QWidget*(Estado&)>;
 
     FluxoEntrada(Estado& estado, MessagePort& mensagens, QString linhaComando,
-                 QList<JanelaAcesso> janelas, CriaJanelaPrincipal criaPrincipal,
+                 FornecedorJanelas janelas, CriaJanelaPrincipal criaPrincipal,
                  QObject* pai = nullptr);
     ~FluxoEntrada() override;
 
@@ -51,7 +51,7 @@ class FluxoEntrada : public QObject {
     Estado& estado_;
     MessagePort& mensagens_;
     QString linhaComando_;
-    QList<JanelaAcesso> janelas_;
+    FornecedorJanelas janelas_;
     CriaJanelaPrincipal criaPrincipal_;
     QPointer<frmSelEmpresa> seleccao_;
     QPointer<frmLogin> login_;

@@ -14,8 +14,7 @@
 
 namespace brasel::app {
 
-frmLogin::frmLogin(Estado& estado, MessagePort& mensagens, QList<JanelaAcesso> janelas,
-                   QWidget* pai)
+frmLogin::frmLogin(Estado& estado, MessagePort& mensagens, FornecedorJanelas janelas, QWidget* pai)
     : QWidget(pai),
       estado_(estado),
       mensagens_(mensagens),

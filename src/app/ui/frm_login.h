@@ -20,7 +20,7 @@ class frmLogin : public QWidget {
 
   public:
     // `janelas`: the program's windows, whose rights a new user gets.
-    frmLogin(Estado& estado, MessagePort& mensagens, QList<JanelaAcesso> janelas,
+    frmLogin(Estado& estado, MessagePort& mensagens, FornecedorJanelas janelas,
              QWidget* pai = nullptr);
 
     // Prepares and shows the window; with Windows authentication in a remote session and
@@ -39,7 +39,7 @@ class frmLogin : public QWidget {
   private:
     Estado& estado_;
     MessagePort& mensagens_;
-    QList<JanelaAcesso> janelas_;
+    FornecedorJanelas janelas_;
     bool entrou_ = false;
 
     QLabel* lblEmpresa_;

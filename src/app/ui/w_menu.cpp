@@ -13,6 +13,7 @@
 #include "common/versao.h"
 #include "devices/gaveta.h"
 #include "devices/mostra_no_display.h"
+#include "pos/ui/frm_facturacao.h"
 
 #include <QCloseEvent>
 #include <QMdiSubWindow>
@@ -35,20 +36,26 @@ constexpr int kIntervaloVersaoMs = 60 * 1000;
 
 }  // namespace
 
-CatalogoJanelas catalogoPrograma(Estado& estado, MessagePort& mensagens) {
+CatalogoJanelas catalogoPrograma(Estado& estado, MessagePort& mensagens,
+                                 devices::LinhaSerie& linha) {
     CatalogoJanelas catalogo;
+    catalogo.registar(QStringLiteral("Movimentos Gerais"),
+                      [&estado, &linha](QWidget* pai) -> QWidget* {
+                          return new pos::frmFacturacao(estado, linha, pai);
+                      });
     catalogo.registar(QStringLiteral("Configurações"),
                       [&estado, &mensagens](QWidget* pai) -> QWidget* {
                           return new AConfiguraRest(estado, mensagens, pai);
                       });
-    catalogo.registar(
-        QStringLiteral("Acessos dos Utilizadores"),
-        [&estado, &mensagens](QWidget* pai) -> QWidget* {
-            return new frmAcessos(
-                estado, mensagens,
-                [&estado, &mensagens] { return catalogoPrograma(estado, mensagens).descricoes(); },
-                pai);
-        });
+    catalogo.registar(QStringLiteral("Acessos dos Utilizadores"),
+                      [&estado, &mensagens, &linha](QWidget* pai) -> QWidget* {
+                          return new frmAcessos(
+                              estado, mensagens,
+                              [&estado, &mensagens, &linha] {
+                                  return catalogoPrograma(estado, mensagens, linha).descricoes();
+                              },
+                              pai);
+                      });
     return catalogo;
 }
 
@@ -56,10 +63,10 @@ WMenu::WMenu(Estado& estado, QWidget* pai)
     : QMainWindow(pai),
       estado_(estado),
       mensagens_(this),
-      catalogo_(catalogoPrograma(estado, mensagens_)),
       area_(new QMdiArea(this)),
       linha_(MapaPortas::ler(estado.config.mapaPortas)),
-      cozinha_(estado, linha_, mensagens_) {
+      cozinha_(estado, linha_, mensagens_),
+      catalogo_(catalogoPrograma(estado, mensagens_, linha_)) {
     setObjectName(QStringLiteral("WMenu"));
     setWindowTitle(QStringLiteral("Brasel"));
     setCentralWidget(area_);
@@ -94,6 +101,10 @@ void WMenu::criarMenu() {
         if (QWidget* botao = barra->widgetForAction(a)) botao->setMinimumHeight(64);
         return a;
     };
+    QMenu* movimentos = menuBar()->addMenu(QStringLiteral("&Movimentos"));
+    movimentos->setObjectName(QStringLiteral("mnuMovimentos"));
+    accao(movimentos, "Testes", QStringLiteral("&Mesas / Facturação"),
+          [this] { abrirFacturacao(); });
     QMenu* utilitarios = menuBar()->addMenu(QStringLiteral("&Utilitários"));
     utilitarios->setObjectName(QStringLiteral("mnuUtilitarios"));
     accao(utilitarios, "DefBott_Fonte", QStringLiteral("&Configurações..."),
@@ -168,6 +179,11 @@ bool WMenu::abrirDialogo(QDialog* dialogo, const QString& caption) {
     if (!verificarAcesso(estado_, dialogo, caption, mensagens_)) return false;
     dialogo->exec();
     return true;
+}
+
+void WMenu::abrirFacturacao() {
+    auto* janela = new pos::frmFacturacao(estado_, linha_, area_);
+    if (abrirJanela(janela, QStringLiteral("Movimentos Gerais"))) janela->showMaximized();
 }
 
 void WMenu::configurar() {

@@ -16,7 +16,8 @@ namespace brasel::app {
 
 // Every window the main window opens, for the rights (the full set of a new user's rights is
 // made from it).
-CatalogoJanelas catalogoPrograma(Estado& estado, MessagePort& mensagens);
+CatalogoJanelas catalogoPrograma(Estado& estado, MessagePort& mensagens,
+                                 devices::LinhaSerie& linha);
 
 // The main window: the frame every working window opens in, with its menu, status bar,
 // background picture and timers. Closing it (or logging off) ends the user's work and asks to
@@ -53,6 +54,7 @@ class WMenu : public QMainWindow {
     void aplicaFundo();
     void acercaDe();
     void configurarImpressora();
+    void abrirFacturacao();
     void configurar();
     void editarAcessos();
     void mudarUtilizador();
@@ -61,11 +63,11 @@ class WMenu : public QMainWindow {
 
     Estado& estado_;
     MensagensJanela mensagens_;
-    CatalogoJanelas catalogo_;
     QMdiArea* area_;
     QList<QLabel*> paineis_;
     devices::LinhaSerie linha_;
     pos::cozinha::PollingCozinha cozinha_;
+    CatalogoJanelas catalogo_;
     QTimer relogio_;
     QTimer versao_;
     QTimer pedidos_;

@@ -1,0 +1,112 @@
+// The tab on PostgreSQL: lines added, read back all at once (their taxes are asked while the
+// lines are read), a quote in a table code and a note, and the last line's deletion.
+#include "app/carrega_parametros.h"
+#include "db/connections.h"
+#include "db/demo/restaurante_demo.h"
+#include "db/schema/servidor.h"
+#include "pos/abertura_mesa.h"
+#include "pos/adicionar_produto.h"
+#include "pos/alteracao_linhas.h"
+#include "pos/tab_teste.h"
+#include "support/servidor_pg.h"
+
+#include <QCoreApplication>
+
+namespace brasel::pos {
+namespace {
+
+class TabPg : public ::testing::Test {
+  protected:
+    void SetUp() override {
+        pg_ = testing::servidorPg();
+        if (!pg_) GTEST_SKIP() << "BRASEL_TEST_PG não definido";
+        servidor_ = db::ServerAddress::parse(pg_->servidor).value_or(db::ServerAddress{});
+        admin_ = {pg_->login, pg_->password};
+        empresa_ = QStringLiteral("J%1").arg(QCoreApplication::applicationPid() % 1000, 3, 10,
+                                             QLatin1Char('0'));
+        QString erro;
+        ASSERT_TRUE(db::schema::criarEmpresa(servidor_, admin_, empresa_, {}, &erro))
+            << erro.toStdString();
+        criada_ = true;
+        ASSERT_TRUE(db::schema::abrirEmpresa(estado_.gConn, servidor_, admin_, empresa_, &erro))
+            << erro.toStdString();
+        ASSERT_TRUE(db::demo::carregarRestauranteDemo(estado_.gConn, pg_->password, {}, &erro))
+            << erro.toStdString();
+        estado_.gServidor = pg_->servidor;
+        estado_.gEmpresa = empresa_;
+        estado_.gLogin = QStringLiteral("SUPERVISOR");
+        estado_.gUtilizador = QStringLiteral("01");
+        app::CarregaParametros(estado_, m_, {});
+        tab_ = std::make_unique<Tab>(estado_, m_, linha_);
+    }
+
+    void TearDown() override {
+        tab_.reset();
+        estado_.gConn.close();
+        if (!criada_) return;
+        db::Connection master;
+        QString password = admin_.password;
+        if (db::Abre_Connexao(master, pg_->servidor, QStringLiteral("Master"), admin_.login,
+                              password, {}, QStringLiteral("SQL"), 30, 10, true)) {
+            master.exec(QStringLiteral("DROP DATABASE IF EXISTS %1 WITH (FORCE)")
+                            .arg(db::nomeBaseDados(empresa_).toLower()));
+        }
+    }
+
+    std::optional<testing::ServidorPg> pg_;
+    db::ServerAddress servidor_;
+    db::schema::Credenciais admin_;
+    QString empresa_;
+    bool criada_ = false;
+    testing::DefinicoesTemporarias definicoes_;
+    app::Estado estado_;
+    testing::MensagensGravadas m_;
+    devices::LinhaSerie linha_;
+    teste::PerguntasGravadas p_;
+    std::unique_ptr<Tab> tab_;
+};
+
+TEST_F(TabPg, LinhasLidasDeUmaVezEApagadas) {
+    ASSERT_TRUE(estado_.gConn.exec(
+        QStringLiteral("insert into Clientes (Codigo,Descricao,PrecoStock,JaImprimiuTalao) values "
+                       "('M''9','Mesa d''Ouro',1,1)")));
+    // It rounds as the dining room's tables do.
+    for (const char* tipo : {"valor", "iva", "desc", "merlin", "desclin", "ivalin", "mergeral",
+                             "descgeral", "ivageral", "totalgeral"}) {
+        for (const char* prefixo : {"dec", "arre"}) {
+            const QString coluna = QLatin1String(prefixo) + QLatin1String(tipo);
+            ASSERT_TRUE(estado_.gConn.exec(
+                QStringLiteral("update Clientes set %1=(select %1 from Clientes where "
+                               "Codigo='M01') where Codigo=?")
+                    .arg(coluna),
+                {QStringLiteral("M'9")}));
+        }
+    }
+    ASSERT_TRUE(tab_->definirTipo(QStringLiteral("VD")));
+    ASSERT_TRUE(AbrirMesa(*tab_, QStringLiteral("M'9")));
+    tab_->pendentes.obs = QStringLiteral("sem 'sal'");
+    std::vector<qint64> linhas;
+    for (const char* produto : {"B003", "B015", "P002"}) {
+        linhas.push_back(AdicionarProduto(*tab_, p_, QString::fromLatin1(produto)));
+        ASSERT_GT(linhas.back(), 0) << produto << m_.textos().join(u'|').toStdString();
+    }
+    // 1.80 + 0.80 + 13 % + 2.50 + 13 %
+    ASSERT_TRUE(AbrirMesa(*tab_, QStringLiteral("M'9")));
+    ASSERT_EQ(tab_->lista().linhas.size(), 3u);
+    EXPECT_EQ(tab_->lista().linhas[0].obsLinha, QStringLiteral("sem 'sal'"));
+    EXPECT_EQ(tab_->lista().totais.total, pricing::teste::V("5.53"));
+    EXPECT_FALSE(tab_->edicaoLivre);
+
+    m_.respostaFinal = true;
+    for (qint64 n : linhas)
+        ASSERT_TRUE(EliminarLinha(*tab_, p_, n));
+    EXPECT_TRUE(tab_->lista().linhas.empty());
+    auto r = estado_.gConn.firstRow(
+        QStringLiteral("select JaImprimiuTalao from Clientes where Codigo=?"),
+        {QStringLiteral("M'9")});
+    ASSERT_TRUE(r);
+    EXPECT_EQ(r->value(0).toInt(), 0);
+}
+
+}  // namespace
+}  // namespace brasel::pos
