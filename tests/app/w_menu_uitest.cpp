@@ -18,6 +18,7 @@
 #include <QAction>
 #include <QDir>
 #include <QLabel>
+#include <QMdiSubWindow>
 #include <QMessageBox>
 
 #include <gtest/gtest.h>
@@ -78,6 +79,15 @@ TEST_F(MenuPrincipal, WindowRefusedByItsRightsRowDoesNotOpen) {
     });
     accao(menu, "DefBott_Fonte")->trigger();
     EXPECT_EQ(mostrada, QStringLiteral("Acesso Negado !"));
+}
+
+TEST_F(MenuPrincipal, TheOrderScreenOpensInsideTheFrame) {
+    WMenu menu(empresa.estado());
+    ASSERT_TRUE(menu.carregar());
+    accao(menu, "Testes")->trigger();
+    ASSERT_EQ(menu.area()->subWindowList().size(), 1);
+    EXPECT_EQ(menu.area()->subWindowList().first()->widget()->objectName(),
+              QStringLiteral("frmFacturacao"));
 }
 
 TEST_F(MenuPrincipal, WaysOutAreNeverDisabledByTheRights) {
