@@ -89,7 +89,8 @@ TEST_F(TabLinhasTeste, ApagarAUltimaLinhaLimpaOTalaoImpresso) {
     EXPECT_TRUE(tab_.lista().linhas.empty());
     EXPECT_TRUE(tab_.lista().totais.total.isZero());
     EXPECT_TRUE(tab_.edicaoLivre);
-    const BotaoMesa* m01 = botao(CarregarClientes(estado()), QStringLiteral("M01"));
+    const std::vector<BotaoMesa> mesas = CarregarClientes(estado());
+    const BotaoMesa* m01 = botao(mesas, QStringLiteral("M01"));
     ASSERT_NE(m01, nullptr);
     EXPECT_EQ(m01->caption, QStringLiteral("Mesa 1"));
     EXPECT_FALSE(m01->ocupada);
