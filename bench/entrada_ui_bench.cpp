@@ -102,17 +102,19 @@ void LoginAteMenuPrincipal(benchmark::State& state) {
     }
 }
 
-// Company OK opens gConn; the login opens gConn, gConnAux and gConnLocks again.
+// Company OK opens gConn; the login opens gConn, gConnAux and gConnLocks again. Argument 1:
+// every connection a new session of the engine, as the first login of a workstation finds them.
 void LoginSoLigacoes(benchmark::State& state) {
     demo();
+    const bool semPooling = state.range(0) == 1;
     for (auto _ : state) {
         db::Connection empresa;
-        abreEmpresa(empresa);
+        abreEmpresa(empresa, semPooling);
         db::Connection principal;
         db::Connection aux;
         db::Connection locks;
         for (db::Connection* c : {&principal, &aux, &locks})
-            abreEmpresa(*c);
+            abreEmpresa(*c, semPooling);
     }
 }
 
@@ -129,6 +131,8 @@ BENCHMARK(LoginAteMenuPrincipal)
     ->Repetitions(7)
     ->ReportAggregatesOnly(true);
 BENCHMARK(LoginSoLigacoes)
+    ->Arg(0)
+    ->Arg(1)
     ->Unit(benchmark::kMillisecond)
     ->Repetitions(7)
     ->ReportAggregatesOnly(true);
