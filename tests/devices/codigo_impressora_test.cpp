@@ -1,5 +1,6 @@
 #include "devices/codigo_impressora.h"
 #include "devices/pagina_codigos.h"
+#include "support/bytes_teste.h"
 #include "support/impressao_qt.h"
 
 #include <gtest/gtest.h>
@@ -7,12 +8,7 @@
 namespace brasel::devices {
 namespace {
 
-QByteArray bytes(std::initializer_list<int> valores) {
-    QByteArray b;
-    for (int v : valores)
-        b.append(static_cast<char>(v));
-    return b;
-}
+using testing::bytes;
 
 TEST(ExtraiCodigoTeste, CampoDeUmCodigo) {
     struct Caso {

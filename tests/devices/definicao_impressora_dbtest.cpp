@@ -1,4 +1,5 @@
 #include "devices/definicao_impressora.h"
+#include "support/bytes_teste.h"
 #include "support/empresa_teste.h"
 #include "support/impressao_qt.h"
 #include "support/mensagens_gravadas.h"
@@ -8,12 +9,7 @@
 namespace brasel::devices {
 namespace {
 
-QByteArray bytes(std::initializer_list<int> valores) {
-    QByteArray b;
-    for (int v : valores)
-        b.append(static_cast<char>(v));
-    return b;
-}
+using testing::bytes;
 
 class DefinicaoImpressoraTeste : public ::testing::Test {
   protected:

@@ -4,6 +4,7 @@
 #include "devices/pagina_codigos.h"
 #include "impressora.h"
 #include "support/aplicacao_gui.h"
+#include "support/bytes_teste.h"
 #include "support/devsim_teste.h"
 #include "support/impressao_qt.h"
 
@@ -14,12 +15,7 @@
 namespace brasel::devices {
 namespace {
 
-QByteArray bytes(std::initializer_list<int> valores) {
-    QByteArray b;
-    for (int v : valores)
-        b.append(static_cast<char>(v));
-    return b;
-}
+using testing::bytes;
 
 // The demo's 80 mm printer on COM1.
 DefinicaoImpressora definicaoDemo() {
