@@ -3,6 +3,7 @@
 #include "db/query_helpers.h"
 
 #include <functional>
+#include <optional>
 #include <vector>
 
 namespace brasel::app {
@@ -17,21 +18,24 @@ struct Coluna {
 };
 
 // Numeric columns are converted only when they hold a number; a NULL leaves the value as it was.
+std::optional<double> numero(const QVariant& v) {
+    bool ok = false;
+    const double n = v.toString().trimmed().toDouble(&ok);
+    if (v.isNull() || !ok) return std::nullopt;
+    return n;
+}
+
 template <typename T>
 Leitor inteiro(T Parametros::*membro) {
     return [membro](const QVariant& v, Parametros& p, MessagePort&) {
-        bool ok = false;
-        const double numero = v.toString().trimmed().toDouble(&ok);
-        if (!v.isNull() && ok) p.*membro = static_cast<T>(numero);
+        if (const auto n = numero(v)) p.*membro = static_cast<T>(*n);
     };
 }
 
 template <std::size_t N>
 Leitor inteiroEm(std::array<std::int32_t, N> Parametros::*membro, int indice) {
     return [membro, indice](const QVariant& v, Parametros& p, MessagePort&) {
-        bool ok = false;
-        const double numero = v.toString().trimmed().toDouble(&ok);
-        if (!v.isNull() && ok) (p.*membro)[indice] = static_cast<std::int32_t>(numero);
+        if (const auto n = numero(v)) (p.*membro)[indice] = static_cast<std::int32_t>(*n);
     };
 }
 
