@@ -15,6 +15,7 @@
 #include "devices/mostra_no_display.h"
 #include "pos/ui/frm_facturacao.h"
 
+#include <QApplication>
 #include <QCloseEvent>
 #include <QMdiSubWindow>
 #include <QMenuBar>
@@ -149,9 +150,12 @@ void WMenu::programaCozinha() {
 }
 
 void WMenu::abrirGaveta() {
+    // The drawer may take a moment (a driver job): the hourglass says the press was taken.
+    QApplication::setOverrideCursor(Qt::WaitCursor);
     devices::AbreGaveta(estado_.gConn, estado_.gUtilizador,
                         {linha_, posto::ConfigRest_CaixaDinheiro.ler(), QString()}, QString(),
                         true);
+    QApplication::restoreOverrideCursor();
 }
 
 void WMenu::aplicaFundo() {
