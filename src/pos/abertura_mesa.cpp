@@ -19,6 +19,26 @@ struct LinhaOutroUtilizador {
     QString ivaTabela;
 };
 
+// The tax region (TabIva.Zona) of every VAT code; a code without a row is in the region "".
+QHash<QString, QString> ZonasIva(db::Connection& conn) {
+    QHash<QString, QString> zonas;
+    auto q = conn.exec(QStringLiteral("select codigo, Zona from TabIva"));
+    while (q && q->next())
+        zonas.insert(q->value(0).toString(), q->value(1).toString().trimmed());
+    return zonas;
+}
+
+// Why a line of VAT table `iva` may not join the tab, "" when it may. Another region is told
+// first: making room among the four tables would not let that line in.
+QString razaoRecusa(const QStringList& ivas, const QString& iva,
+                    const QHash<QString, QString>& zonas) {
+    if (!Ver_Zonas_IVA_MovProduto_bln(ivas, iva, zonas))
+        return QStringLiteral("IVA de Zonas Diferentes");
+    if (!Ver_4_Ivas_MovProduto_bln(ivas, iva))
+        return QStringLiteral("Atingido o Limite de quatro IVAS");
+    return {};
+}
+
 // The distinct VAT tables of the user's open lines on the tab's table and type.
 QStringList IvasDaTab(Tab& tab) {
     QStringList ivas;
@@ -32,6 +52,19 @@ QStringList IvasDaTab(Tab& tab) {
 }
 
 }  // namespace
+
+bool Ver_4_Ivas_MovProduto_bln(const QStringList& ivasDaTab, const QString& iva) {
+    return iva.isEmpty() || ivasDaTab.contains(iva) || ivasDaTab.size() < 4;
+}
+
+bool Ver_Zonas_IVA_MovProduto_bln(const QStringList& ivasDaTab, const QString& iva,
+                                  const QHash<QString, QString>& zonas) {
+    if (iva.isEmpty()) return true;
+    const QString zona = zonas.value(iva);
+    for (const QString& daTab : ivasDaTab)
+        if (zonas.value(daTab) != zona) return false;
+    return true;
+}
 
 QStringList TransfereLinhasOutrosUtilizadores(Tab& tab) {
     app::Estado& estado = tab.estado();
@@ -58,13 +91,14 @@ QStringList TransfereLinhasOutrosUtilizadores(Tab& tab) {
     q.reset();
 
     QStringList ivas = IvasDaTab(tab);
+    const QHash<QString, QString> zonas = ZonasIva(estado.gConn);
     QStringList recusadas;
     db::WriteTransaction transaccao(estado.gConn);
     if (!transaccao.active()) return {};
     for (const LinhaOutroUtilizador& l : linhas) {
-        if (!l.ivaTabela.isEmpty() && !ivas.contains(l.ivaTabela) && ivas.size() >= 4) {
-            recusadas << QStringLiteral("(") + l.codigo +
-                             QStringLiteral(") -> Atingido o Limite de quatro IVAS");
+        const QString razao = razaoRecusa(ivas, l.ivaTabela, zonas);
+        if (!razao.isEmpty()) {
+            recusadas << QStringLiteral("(") + l.codigo + QStringLiteral(") -> ") + razao;
             continue;
         }
         if (!estado.gConn.exec(

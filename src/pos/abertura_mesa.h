@@ -2,6 +2,7 @@
 
 #include "pos/tab.h"
 
+#include <QHash>
 #include <QString>
 #include <QStringList>
 
@@ -18,10 +19,21 @@ inline constexpr const char* kDisplayProximoCliente = "Proximo Cliente...";
 bool AbrirMesa(Tab& tab, const QString& codigo);
 
 // Moves, after the person agrees, the open lines of the tab's table and type that other users
-// hold to the tab's user, one by one, each logged. A line whose VAT table would be a fifth one
-// in the user's tab stays where it is; the lines that stayed are listed in one warning. Returns
-// those lines' texts ("(code) -> reason"), empty when everything moved or nothing was asked.
+// hold to the tab's user, one by one, each logged. A line whose VAT table belongs to another
+// tax region (TabIva.Zona) than those of the user's tab, or would be a fifth VAT table in it,
+// stays where it is; the lines that stayed are listed in one warning. Returns those lines'
+// texts ("(code) -> reason"), empty when everything moved or nothing was asked.
 QStringList TransfereLinhasOutrosUtilizadores(Tab& tab);
+
+// Whether a line of VAT table `iva` may join a tab holding the VAT tables `ivasDaTab`: a table
+// already there, or a new one while the tab holds fewer than four. A line without VAT always
+// may.
+bool Ver_4_Ivas_MovProduto_bln(const QStringList& ivasDaTab, const QString& iva);
+// Whether a line of VAT table `iva` keeps the tab in one tax region: its region (by `zonas`,
+// code -> TabIva.Zona; "" for a code not there) is that of every table the tab holds. A line
+// without VAT always does.
+bool Ver_Zonas_IVA_MovProduto_bln(const QStringList& ivasDaTab, const QString& iva,
+                                  const QHash<QString, QString>& zonas);
 
 // What the order screen starts with: the user's cash-sale type (UtilConfGeral.VendaPronto) and,
 // when the user's MostraCliDiverso is 1, the walk-in customer (ParamGeral.Clidiversos).

@@ -7,6 +7,8 @@
 #include "documents/lanca_mov_produto.h"
 #include "documents/producao.h"
 #include "documents/saldo_produto.h"
+#include "pos/adicionar_produto_localizacao.h"
+#include "pos/adicionar_produto_lote.h"
 #include "pos/alteracao_linhas.h"
 #include "pos/cozinha/envio_pedido.h"
 #include "pricing/arredonda.h"
@@ -22,6 +24,9 @@
 namespace brasel::pos {
 
 namespace {
+
+const QString kFalhaLancamento =
+    QStringLiteral("Não foi possível efectuar o Lançamento do produto ");
 
 // Clears the busy flag however the press ends.
 class Ocupado {
@@ -135,6 +140,12 @@ bool Adicao::verificacoes(const QString& codigo) {
     produto_ = *p;
     if (tab_.Luzes) tab_.Luzes('R');
 
+    const std::optional<LocalizacaoEncontrada> local =
+        LocalizacaoProduto_Procura(conn_, produto_.codigo, linha_.Armazem);
+    if (!local) return recusa(kFalhaLancamento + produto_.codigo);
+    if (!local->registada) return recusa(QStringLiteral("Localização Inexistente"));
+    linha_.Localizacao = local->codigo;
+
     // The VAT table the line will carry: the customer's equivalent when there is one.
     ivaTabela_ = produto_.ivaTabVenda;
     ivaTaxa_ = produto_.ivaTaxaVenda;
@@ -170,6 +181,7 @@ bool Adicao::verificacoes(const QString& codigo) {
         db::ChavesSaldo chaves;
         chaves.Produto = produto_.codigo;
         chaves.Armazem = linha_.Armazem;
+        chaves.Localizacao = linha_.Localizacao;
         chaves.Estacao = linha_.Estacao;
         chaves.Sexo = linha_.Sexo;
         chaves.Referencia = linha_.Referencia;
@@ -191,8 +203,9 @@ bool Adicao::verificacoes(const QString& codigo) {
              pricing::textoSql(tab_.utilizador())});
         const Currency jaLancado = r ? Currency::fromVariant(r->value(0)) : Currency{};
         const std::optional<LoteEscolhido> lote = perguntas_.lote(produto_.codigo, jaLancado);
-        if (!lote || lote->lote.trimmed().isEmpty())
-            return recusa(QStringLiteral("Não seleccionou qualquer Lote"));
+        if (!lote) return recusa(QStringLiteral("Não seleccionou qualquer Lote"));
+        const QString invalido = ValidaLote(*lote);
+        if (!invalido.isEmpty()) return recusa(invalido);
         linha_.Lote = lote->lote;
         linha_.DataFabrico = lote->dataFabrico;
         linha_.DataValidade = lote->dataValidade;
@@ -314,8 +327,7 @@ std::int64_t Adicao::grava(std::int64_t substitui) {
         else if (r.recusa == documents::RecusaLancamento::SemLote)
             recusa(QStringLiteral("Não seleccionou qualquer Lote"));
         else
-            recusa(QStringLiteral("Não foi possível efectuar o Lançamento do produto ") +
-                   produto_.codigo);
+            recusa(kFalhaLancamento + produto_.codigo);
         return 0;
     }
     pricing::Impostos impostos(estado_, &conn_);
@@ -345,8 +357,7 @@ void Adicao::mostra(std::int64_t numRegisto) {
 }
 
 std::int64_t Adicao::executar(const QString& codigo, const QString& texto, std::int64_t substitui) {
-    const auto armazem = conn_.firstRow(QStringLiteral("select armazem from ParamGeral"));
-    linha_.Armazem = armazem ? armazem->value(0).toString() : estado_.gArmazem;
+    linha_.Armazem = ArmazemLinhasTab(estado_);
     std::int64_t numRegisto = 0;
     try {
         if (verificacoes(codigo)) {
@@ -367,6 +378,12 @@ std::int64_t Adicao::executar(const QString& codigo, const QString& texto, std::
 }
 
 }  // namespace
+
+QString ArmazemLinhasTab(app::Estado& estado) {
+    const auto r = estado.gConn.firstRow(QStringLiteral("select armazem from ParamGeral"));
+    const QString armazem = r ? r->value(0).toString().trimmed() : QString();
+    return armazem.isEmpty() ? estado.gArmazem : armazem;
+}
 
 std::int64_t AdicionarProduto(Tab& tab, PerguntasTab& perguntas, const QString& codigo,
                               const QString& texto, std::int64_t substitui) {

@@ -78,12 +78,13 @@ std::optional<DescontoFinanceiro> DescontoFinanceiro_Calcular(
             if (d.percentagem > 0.0) d.valor = arredonda(Base.percentOf(d.percentagem));
             return d;
         }
+        // Tab lines hold the login of their user, not the user's code.
         auto linhas = c.exec(
             QStringLiteral("select Codigo,ValorIliq,TotalDesconto,COALESCE(SelecFecha,0) from "
                            "MovProduto where Tipo=? and Numero=? and Ano=? and CliFor='C' and "
                            "Terceiro=? and Utilizador=? order by NumRegisto"),
             {textoSql(Tipo), textoSql(Numero), textoSql(Ano), textoSql(Cliente),
-             textoSql(estado.gUtilizador)});
+             textoSql(estado.gLogin)});
         if (!linhas) return std::nullopt;
         const Classificacao doCliente = classificacao(c, QStringLiteral("Clientes"), Cliente);
         Currency soma;

@@ -25,6 +25,20 @@ class AdicionarProdutoTeste : public teste::TabTeste {
                                     {numRegisto});
         return r ? r->value(0) : QVariant();
     }
+    // Stock of a product in the demo's warehouse, at a location.
+    void existencia(const char* produto, const char* quantidade, const char* localizacao,
+                    const char* lote = "") {
+        insere(estado(), "MovProduto",
+               {{"Codigo", T(produto)},
+                {"AfectaStk", T("E+")},
+                {"QuantNormal", T(quantidade)},
+                {"Armazem", T("001")},
+                {"Localizacao", T(localizacao)},
+                {"Lote", T(lote)},
+                {"CliFor", T("F")},
+                {"Fechado", T("S")},
+                {"Identifica", T(produto) + T(localizacao) + T(lote)}});
+    }
     // Four VAT tables on the tab: the demo's three and one more.
     void quatroIvas() {
         insere(estado(), "TabIva", {{"codigo", T("Z4")}, {"Taxa", T("5")}, {"Incluido", 0}});
@@ -64,11 +78,20 @@ const Recusa kRecusas[] = {
          t.actualiza(QStringLiteral("update Produtos set ctrlexistencia=1 where Codigo='B001'"));
      },
      "B001", "Não pode Lançar.\r\nProduto sem Existência!"},
+    {"localização que não existe", [](auto& t, auto&, auto&) { t.existencia("B001", "5", "XPT"); },
+     "B001", "Localização Inexistente"},
     {"lote não escolhido",
      [](auto& t, auto&, auto&) {
          t.actualiza(QStringLiteral("update Produtos set Lote='1' where Codigo='P002'"));
      },
      "P002", "Não seleccionou qualquer Lote"},
+    {"validade do lote antes do fabrico",
+     [](auto& t, auto&, auto& p) {
+         t.actualiza(QStringLiteral("update Produtos set Lote='S' where Codigo='P002'"));
+         p.loteEscolhido = LoteEscolhido{QStringLiteral("L1"), QStringLiteral("2026-03-01"),
+                                         QStringLiteral("2026-02-28")};
+     },
+     "P002", "A Data de Validade é anterior à Data de Fabrico!"},
     {"balança sem peso", [](auto&, auto&, auto&) {}, "P010", ""},
     {"produção por configurar",
      [](auto&, auto& e, auto&) {
@@ -81,14 +104,16 @@ const Recusa kRecusas[] = {
      "P002", "As Configurações para produção, estão Incompletas!"},
 };
 
-class RecusaTeste : public AdicionarProdutoTeste, public ::testing::WithParamInterface<Recusa> {};
+class RecusaAdicaoTeste : public AdicionarProdutoTeste,
+                          public ::testing::WithParamInterface<Recusa> {};
 
-TEST_P(RecusaTeste, NaoDeixaLinhaProducaoNemPedido) {
+TEST_P(RecusaAdicaoTeste, NaoDeixaLinhaProducaoNemPedido) {
     const Recusa& c = GetParam();
     c.prepara(*this, estado(), p_);
+    const qint64 antes = linhasMovProduto();
     tab_.pendentes.obs = QStringLiteral("nota");
     EXPECT_EQ(AdicionarProduto(tab_, p_, QString::fromLatin1(c.produto)), 0);
-    EXPECT_EQ(linhasMovProduto(), 0);
+    EXPECT_EQ(linhasMovProduto(), antes);
     EXPECT_EQ(pedidosCozinha(), 0);
     EXPECT_EQ(ligacoes(), 0);
     EXPECT_TRUE(tab_.lista().linhas.empty());
@@ -102,7 +127,7 @@ TEST_P(RecusaTeste, NaoDeixaLinhaProducaoNemPedido) {
     EXPECT_EQ(tab_.pendentes.obs, QStringLiteral("nota"));
 }
 
-INSTANTIATE_TEST_SUITE_P(Passos, RecusaTeste, ::testing::ValuesIn(kRecusas),
+INSTANTIATE_TEST_SUITE_P(Passos, RecusaAdicaoTeste, ::testing::ValuesIn(kRecusas),
                          [](const ::testing::TestParamInfo<Recusa>& i) {
                              return std::string("caso") + std::to_string(i.index);
                          });
@@ -117,6 +142,54 @@ TEST_F(AdicionarProdutoTeste, QuintoIvaRecusadoOsQuatroAceites) {
     EXPECT_EQ(linhasMovProduto(), antes);
     // A fifth line of one of the four tables still goes in.
     EXPECT_GT(AdicionarProduto(tab_, p_, QStringLiteral("B002")), 0);
+}
+
+TEST_F(AdicionarProdutoTeste, LinhaGuardaLocalizacaoLoteComDatasEReferencia) {
+    existencia("P002", "3", "BAR", "L1");
+    existencia("P002", "6", "COZ", "L1");
+    estado().param.prontovestir = 1;
+    actualiza(QStringLiteral("update Produtos set Lote='1', Referencia=1 where Codigo='P002'"));
+    p_.loteEscolhido = LoteEscolhido{QStringLiteral("L1"), QStringLiteral("2026-01-31"),
+                                     QStringLiteral("2026-12-31")};
+    ReferenciaEscolhida ref;
+    ref.atributos = {QStringLiteral("V"),   QStringLiteral("M"),  QStringLiteral("REF'1"),
+                     QStringLiteral("MOD"), QStringLiteral("AZ"), QStringLiteral("42"),
+                     QStringLiteral("L")};
+    ref.fornecedor = QStringLiteral("F01");
+    p_.referenciaEscolhida = ref;
+    const qint64 n = AdicionarProduto(tab_, p_, QStringLiteral("P002"));
+    ASSERT_GT(n, 0) << m_.textos().join(u'|').toStdString();
+    const std::pair<const char*, const char*> esperados[] = {
+        {"Localizacao", "COZ"},
+        {"Lote", "L1"},
+        {"DataFabrico", "2026-01-31"},
+        {"DataValidade", "2026-12-31"},
+        {"Estacao", "V"},
+        {"Sexo", "M"},
+        {"Referencia", "REF'1"},
+        {"Modelo", "MOD"},
+        {"Cor", "AZ"},
+        {"Tamanho", "42"},
+        {"Comprimento", "L"},
+        {"Fornece", "F01"},
+    };
+    for (const auto& [coluna, valor] : esperados)
+        EXPECT_EQ(campo(n, coluna).toString(), QString::fromLatin1(valor)) << coluna;
+    // The lot form was told what the tab held of the product before.
+    EXPECT_TRUE(p_.perguntas.contains(QStringLiteral("lote 0")));
+}
+
+TEST_F(AdicionarProdutoTeste, ControloDeExistenciaNaLocalizacaoDoProduto) {
+    actualiza(QStringLiteral("update Produtos set ctrlexistencia=1 where Codigo='B001'"));
+    existencia("B001", "2", "BAR");
+    for (int i = 0; i < 2; ++i) {
+        const qint64 n = AdicionarProduto(tab_, p_, QStringLiteral("B001"));
+        ASSERT_GT(n, 0) << m_.textos().join(u'|').toStdString();
+        EXPECT_EQ(campo(n, "Localizacao").toString(), QStringLiteral("BAR"));
+    }
+    // The bar's stock is sold: nothing is left anywhere in the warehouse.
+    EXPECT_EQ(AdicionarProduto(tab_, p_, QStringLiteral("B001")), 0);
+    EXPECT_TRUE(m_.contem(QStringLiteral("Não pode Lançar.\r\nProduto sem Existência!")));
 }
 
 TEST_F(AdicionarProdutoTeste, LinhaComIvaIncluidoFicaComOPrecoSemIvaEOTotalDoPreco) {

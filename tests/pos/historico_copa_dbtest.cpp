@@ -38,7 +38,8 @@ TEST(HistoricoCopa, OrderAndCancellationStoreTheirValuesExactly) {
         const char* marca;
     } casos[] = {
         {"order keeps a note with quotes", false, aspas, aspas, "N"},
-        {"cancellation never keeps a note", true, aspas, QString(), "S"},
+        {"cancellation never keeps a note", true, aspas, QStringLiteral(""), "S"},
+        {"order without a note", false, QString(), QStringLiteral(""), "N"},
     };
     for (const Caso& c : casos) {
         SCOPED_TRACE(c.nome);
@@ -58,6 +59,8 @@ TEST(HistoricoCopa, OrderAndCancellationStoreTheirValuesExactly) {
         EXPECT_EQ(Currency::fromVariant(r->value(2)), p.quantidade);
         EXPECT_EQ(r->value(3).toString(), QStringLiteral("M01"));
         EXPECT_EQ(r->value(4).toString(), c.obsGuardada);
+        // '' and not NULL: the queue's readers and "ObsLinha=''" must see an empty note.
+        EXPECT_FALSE(r->value(4).isNull());
         EXPECT_EQ(r->value(5).toInt(), 0);
         EXPECT_EQ(r->value(6).toString(), QStringLiteral("ANA"));
         EXPECT_EQ(r->value(7).toString().size(), 19) << r->value(7).toString().toStdString();

@@ -1,16 +1,22 @@
 // The tab on PostgreSQL: lines added, read back all at once (their taxes are asked while the
-// lines are read), a quote in a table code and a note, and the last line's deletion.
+// lines are read), a quote in a table code and a note, and the last line's deletion; the
+// location and lots a line is taken from, and another region's line kept by its user.
 #include "app/carrega_parametros.h"
 #include "db/connections.h"
 #include "db/demo/restaurante_demo.h"
 #include "db/schema/servidor.h"
 #include "pos/abertura_mesa.h"
 #include "pos/adicionar_produto.h"
+#include "pos/adicionar_produto_localizacao.h"
+#include "pos/adicionar_produto_lote.h"
 #include "pos/alteracao_linhas.h"
 #include "pos/tab_teste.h"
 #include "support/servidor_pg.h"
 
 #include <QCoreApplication>
+
+#include <tuple>
+#include <utility>
 
 namespace brasel::pos {
 namespace {
@@ -106,6 +112,50 @@ TEST_F(TabPg, LinhasLidasDeUmaVezEApagadas) {
         {QStringLiteral("M'9")});
     ASSERT_TRUE(r);
     EXPECT_EQ(r->value(0).toInt(), 0);
+}
+
+TEST_F(TabPg, LocalizacaoLotesEZonaDoIva) {
+    int n = 0;
+    for (const auto& [local, lote, quantidade] :
+         {std::tuple{"BAR", "L1", "3"}, std::tuple{"COZ", "L2", "5"}, std::tuple{"", "L2", "-1"}}) {
+        ASSERT_TRUE(estado_.gConn.exec(
+            QStringLiteral("insert into MovProduto (Codigo,AfectaStk,QuantNormal,Armazem,"
+                           "Localizacao,Lote,DataValidade,Identifica) values "
+                           "('P002','E+',?,'001',?,?,'2026-06-30',?)"),
+            {QString::fromLatin1(quantidade), QString::fromLatin1(local), QString::fromLatin1(lote),
+             QStringLiteral("PG%1").arg(++n)}))
+            << estado_.gConn.lastError().toStdString();
+    }
+    const auto local =
+        LocalizacaoProduto_Procura(estado_.gConn, QStringLiteral("P002"), QStringLiteral("001"));
+    ASSERT_TRUE(local.has_value());
+    EXPECT_EQ(local->codigo, QStringLiteral("COZ"));
+    EXPECT_TRUE(local->registada);
+    const auto lotes =
+        LotesDisponiveis(estado_.gConn, QStringLiteral("P002"), QStringLiteral("001"));
+    ASSERT_TRUE(lotes.has_value());
+    ASSERT_EQ(lotes->size(), 2u);
+    EXPECT_EQ((*lotes)[0].lote, QStringLiteral("L1"));
+    EXPECT_EQ((*lotes)[1].saldo, pricing::teste::V("4"));
+    EXPECT_EQ((*lotes)[1].dataValidade, QStringLiteral("2026-06-30"));
+
+    ASSERT_TRUE(estado_.gConn.exec(
+        QStringLiteral("insert into TabIva (codigo,Taxa,Zona) values ('RM',4,'M')")));
+    for (const auto& [produto, iva] : {std::pair{"N1", "NO"}, std::pair{"N2", "RM"}}) {
+        ASSERT_TRUE(estado_.gConn.exec(
+            QStringLiteral("insert into MovProduto (Codigo,Tipo,Numero,CliFor,Terceiro,"
+                           "Utilizador,Fechado,IvaTabela,Identifica) values "
+                           "(?,'VD','','C','M01','ANA','N',?,?)"),
+            {QString::fromLatin1(produto), QString::fromLatin1(iva),
+             QString::fromLatin1(produto)}));
+    }
+    ASSERT_TRUE(tab_->definirTipo(QStringLiteral("VD")));
+    m_.responder({true});
+    ASSERT_TRUE(AbrirMesa(*tab_, QStringLiteral("M01")));
+    EXPECT_EQ(m_.textos(), QStringList{QStringLiteral("Não foi possível passar todos os "
+                                                      "Produtos:\r\n(N2) -> IVA de Zonas "
+                                                      "Diferentes")});
+    EXPECT_EQ(tab_->lista().linhas.size(), 1u);
 }
 
 }  // namespace

@@ -218,7 +218,7 @@ TEST_F(TabelasPrecos, DescontoFinanceiro_FromTheCustomerOrLineByLine) {
                 {"Ano", T("2024")},
                 {"CliFor", T("C")},
                 {"Terceiro", T("M1")},
-                {"Utilizador", e.gUtilizador},
+                {"Utilizador", e.gLogin},
                 {"ValorIliq", T(iliq)},
                 {"TotalDesconto", T(desc)},
                 {"SelecFecha", sel},

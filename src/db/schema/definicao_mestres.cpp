@@ -185,11 +185,13 @@ void acrescentaMestres(QList<Tabela>& t) {
                  .imagem({"foto"})
                  .inteiro({"Reembolso"})
                  .unico({"codigo"}));
+    // Zona: the tax region whose rates the code belongs to; one tab never mixes two regions.
     t.append(Def("TabIva")
                  .texto({"codigo"})
                  .montante({"Taxa"})
                  .inteiro({"Incluido"})
                  .montante({"TaxaInerente", "TaxaCustos"})
+                 .texto({"Zona"})
                  .unico({"codigo"}));
     t.append(tabTipoMov());
     t.append(

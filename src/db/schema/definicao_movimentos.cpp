@@ -126,6 +126,7 @@ void acrescentaMovimentos(QList<Tabela>& t) {
                  .indice({"Terceiro", "CliFor", "Numero", "Fechado"})
                  .indice({"Tipo", "Numero", "Ano"})
                  .indice({"Codigo", "Data"})
+                 .indice({"Codigo", "Localizacao"})
                  .indice({"Data"}));
     t.append(linhasDocumento("HistoricoGuias").indice({"Identifica"}));
     t.append(Def("ProdutosPacksHistorico")

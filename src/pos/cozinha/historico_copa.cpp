@@ -1,6 +1,7 @@
 #include "pos/cozinha/historico_copa.h"
 
 #include "db/query_helpers.h"
+#include "pricing/leitura.h"
 
 #include <QSqlQuery>
 #include <QSqlRecord>
@@ -12,12 +13,16 @@ namespace {
 bool mete(db::Sessao& sessao, const PedidoCozinha& pedido, bool anulacao, db::Connection* conn) {
     db::Connection& c = sessao.ligacao(conn);
     const QString agora = db::Get_DataSysServer_InsertIntoSQL(sessao, &c);
+    // A null QString binds SQL NULL: a cancellation's note, and any text left unset, must be
+    // stored as '' for the queue's readers and for "ObsLinha=''" to find them.
     return c
         .exec(QStringLiteral("insert into HistoricoCopa (Produto,Descricao,Quantidade,Cliente,"
                              "ObsLinha,PodeImprimir,Utilizador,DataSys,ANULACAO) "
                              "values (?,?,?,?,?,0,?,?,?)"),
-              {pedido.produto, pedido.descricao, pedido.quantidade.toText(), pedido.mesa,
-               anulacao ? QString() : pedido.obs, pedido.utilizador, agora,
+              {pricing::textoSql(pedido.produto), pricing::textoSql(pedido.descricao),
+               pedido.quantidade.toText(), pricing::textoSql(pedido.mesa),
+               pricing::textoSql(anulacao ? QString() : pedido.obs),
+               pricing::textoSql(pedido.utilizador), agora,
                anulacao ? QStringLiteral("S") : QStringLiteral("N")})
         .has_value();
 }

@@ -3,6 +3,8 @@
 #include "app/ui/frm_password_supervisor.h"
 #include "devices/ui/frm_balanca.h"
 #include "pos/ui/a_clientes.h"
+#include "pos/ui/frm_lote.h"
+#include "pos/ui/frm_referencia.h"
 
 namespace brasel::pos {
 
@@ -50,20 +52,14 @@ std::optional<QString> PerguntasJanela::tipoMovimento() {
     return campo.codigo;
 }
 
-std::optional<LoteEscolhido> PerguntasJanela::lote(const QString&, Currency) {
-    lookups::CampoCodigo campo;
-    pesquisa_.LotesTabela(campo, true);
-    if (campo.codigo.isEmpty()) return std::nullopt;
-    return LoteEscolhido{campo.codigo, {}, {}};
+std::optional<LoteEscolhido> PerguntasJanela::lote(const QString& produto, Currency jaLancado) {
+    frmLote form(estado_, mensagens_, pesquisa_, teclado_, produto, jaLancado, pai_);
+    return form.escolher();
 }
 
-std::optional<ReferenciaEscolhida> PerguntasJanela::referencia(const QString&) {
-    lookups::CampoCodigo campo;
-    pesquisa_.Fornecedores(campo, true);
-    if (campo.codigo.isEmpty()) return std::nullopt;
-    ReferenciaEscolhida r;
-    r.fornecedor = campo.codigo;
-    return r;
+std::optional<ReferenciaEscolhida> PerguntasJanela::referencia(const QString& produto) {
+    frmReferencia form(estado_, pesquisa_, produto, pai_);
+    return form.escolher();
 }
 
 }  // namespace brasel::pos

@@ -14,7 +14,7 @@
 namespace brasel::pos {
 
 // The order screen's answers to the tab's questions: the touch keypad and keyboard, the
-// supervisor's password, the table and group pickers, the type, lot and supplier lookups, the
+// supervisor's password, the table picker, the type lookup, the lot and reference forms, the
 // barcode interaction form and the weighing dialog, each modal over `pai`.
 class PerguntasJanela : public PerguntasTab {
   public:
