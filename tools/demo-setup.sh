@@ -24,11 +24,17 @@ else
     chmod 600 "$run/password"
 fi
 
+# The demo's own signing key, made once and kept beside it (never a deployment's key).
+chave="$run/chave.key"
+if [ ! -f "$chave" ]; then
+    "$admin" generate-key --file "$chave"
+fi
+
 # Config.cfg: data folder, signing-key file, certificate number, serial-port map, update folder.
 # The port map is the device simulator's: COM1 the ticket printer, COM2 the customer display.
 dispositivos="$run/dispositivos"
 mkdir -p "$dispositivos"
-printf '%s\r\n%s\r\n%s\r\n%s\r\n%s\r\n' "$dados" "$run/chave-assinatura.txt" "0000/AT" \
+printf '%s\r\n%s\r\n%s\r\n%s\r\n%s\r\n' "$dados" "$chave" "9999" \
     "$dispositivos/portas.cfg" "$run/actualizacoes" > "$run/Config.cfg"
 
 if [ ! -f "$dados/Vendrola0001.sqlite" ]; then

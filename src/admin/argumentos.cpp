@@ -37,6 +37,12 @@ const QList<Comando>& comandos() {
           QStringLiteral("password")},
          {},
          {}},
+        {QStringLiteral("generate-key"), {QStringLiteral("file")}, {}, {}},
+        {QStringLiteral("verify-signatures"),
+         {QStringLiteral("server"), QStringLiteral("company"), QStringLiteral("login"),
+          QStringLiteral("password")},
+         {QStringLiteral("public"), QStringLiteral("key")},
+         {}},
         {QStringLiteral("add-server"),
          {QStringLiteral("server")},
          {QStringLiteral("login"), QStringLiteral("password"), QStringLiteral("auth")},
@@ -105,6 +111,15 @@ QString textoAjuda() {
         "  check         Verifica uma empresa: versão, tabelas e colunas, linhas obrigatórias\n"
         "                e a configuração inicial.\n"
         "                --server S --company CCCC --login L --password P\n"
+        "  generate-key  Gera uma chave de assinatura nova (para demonstração) no ficheiro F,\n"
+        "                legível só pelo dono, e a sua metade pública em F.pub.pem.\n"
+        "                --file F\n"
+        "  verify-signatures\n"
+        "                Verifica todas as cadeias de assinaturas dos documentos da empresa e\n"
+        "                indica o primeiro documento que não confere em cada uma. Basta a chave\n"
+        "                pública (PEM) ou, em alternativa, o ficheiro da chave.\n"
+        "                --server S --company CCCC --login L --password P\n"
+        "                (--public F.pub.pem | --key F)\n"
         "  add-server    Acrescenta o servidor à lista de empresas deste posto (ou actualiza\n"
         "                o seu login e password).\n"
         "                --server S [--login L --password P] [--auth SQL|WIN]\n"

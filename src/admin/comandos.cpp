@@ -1,5 +1,6 @@
 #include "admin/comandos.h"
 
+#include "admin/assinaturas.h"
 #include "admin/verificacao.h"
 #include "app/definicoes_posto.h"
 #include "common/settings_store.h"
@@ -190,6 +191,7 @@ int executar(const Pedido& p, Consola& consola) {
         consola.saida << textoAjuda();
         return kSucesso;
     }
+    if (p.comando == QStringLiteral("generate-key")) return gerarChave(p, consola);
     Contexto c;
     const auto servidor = db::ServerAddress::parse(p.opcao(QStringLiteral("server")));
     if (!servidor) {
@@ -214,6 +216,9 @@ int executar(const Pedido& p, Consola& consola) {
     if (p.comando == QStringLiteral("create")) return criarEmpresa(p, c, consola);
     if (p.comando == QStringLiteral("upgrade")) return actualizarEmpresa(c, consola);
     if (p.comando == QStringLiteral("demo")) return carregarDemo(p, c, consola);
+    if (p.comando == QStringLiteral("verify-signatures")) {
+        return verificarAssinaturas(p, c.servidor, c.credenciais, c.empresa, consola);
+    }
     return verificarEmpresa(c.servidor, c.credenciais, c.empresa, consola) ? kSucesso : kFalha;
 }
 

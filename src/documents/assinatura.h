@@ -19,6 +19,14 @@ struct Assinatura {
     QString notaCertificacao;
 };
 
+// The text a document's signature is made over: Data, DataSys as "yyyy-MM-ddTHH:mm:ss",
+// "Tipo Ano/Numero" (the year being the first four characters of Data), the total with two
+// decimals and "." (no thousands separator) and the signature of the previous document of the
+// type and year, each but the last followed by ";". nullopt when DataSys is not a date and time.
+std::optional<QString> TextoAssinatura(const QString& Data, const QString& DataSys,
+                                       const QString& Tipo, const QString& Numero,
+                                       Currency TotalDoc, const QString& HashAnterior);
+
 // Signs a new document of type `Tipo` (customer "C" documents in MovCliente, supplier "F" in
 // MovFornece) dated `Data` ("yyyy-MM-dd"), chaining it to the previous document of its type and
 // year. `DataSys` comes back as "yyyy-MM-ddTHH:mm:ss". False when no signature could be made
