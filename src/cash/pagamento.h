@@ -15,7 +15,8 @@ struct Pagamento {
     Currency desconto;  // totalDoc - valorPagar
     Currency entregou;  // amount tendered, in the company's currency
     Currency troco;
-    QString cambio;
+    QString cambio;             // currency the customer paid in (the company's when "")
+    Currency entregouNoCambio;  // amount tendered as counted, in `cambio`
     QString observa;
 };
 

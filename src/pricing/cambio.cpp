@@ -75,13 +75,17 @@ std::optional<ValorSeisDecimais> ConverteCambio_SEIS_Decimais(app::Estado& estad
     const ValorSeisDecimais igual{static_cast<std::int64_t>(milionesimos)};
     const QString moeda = Moeda.trimmed().toUpper();
     if (moeda.isEmpty() || moeda == estado.param.cambiodef.trimmed().toUpper()) return igual;
-    const bool multiplica = Sentido.trimmed() == u"+";
-    if (!multiplica && Sentido.trimmed() != u"-") return igual;
-    const auto linha = db::primeiraLinha(estado.ligacao(conn),
-                                         QStringLiteral("select valor from Cambios where codigo=?"),
-                                         {Moeda.trimmed()});
+    const bool entra = Sentido.trimmed() == u"+";
+    if (!entra && Sentido.trimmed() != u"-") return igual;
+    db::Connection& ligacao = estado.ligacao(conn);
+    const auto linha = db::primeiraLinha(
+        ligacao, QStringLiteral("select valor from Cambios where codigo=?"), {Moeda.trimmed()});
     const auto taxa = linha ? lerTaxa(linha->value(0)) : std::nullopt;
     if (!taxa) return igual;
+    const auto formula =
+        db::primeiraLinha(ligacao, QStringLiteral("select FormulaCalcCambioB from ParamGeral"));
+    const bool inversa = formula && formula->value(0).toInt() == kCambioUnidadesPorMoedaEmpresa;
+    const bool multiplica = entra != inversa;
     __int128 produto = 0;
     const __int128 factor = multiplica ? taxa->mantissa : potencia10(taxa->escala);
     if (__builtin_mul_overflow(milionesimos, factor, &produto)) return std::nullopt;
