@@ -9,6 +9,8 @@
 #include "app/ui/frm_acessos.h"
 #include "app/ui/frm_muda_utilizador.h"
 #include "app/verifica_versao.h"
+#include "cash/ui/frm_alt_caixa.h"
+#include "cash/ui/frm_registo_de_caixa.h"
 #include "common/ui/estilo_tactil.h"
 #include "common/versao.h"
 #include "devices/gaveta.h"
@@ -43,6 +45,10 @@ CatalogoJanelas catalogoPrograma(Estado& estado, MessagePort& mensagens,
     catalogo.registar(QStringLiteral("Movimentos Gerais"),
                       [&estado, &linha](QWidget* pai) -> QWidget* {
                           return new pos::frmFacturacao(estado, linha, pai);
+                      });
+    catalogo.registar(QStringLiteral("Registo de Caixa"),
+                      [&estado, &mensagens](QWidget* pai) -> QWidget* {
+                          return new cash::frmRegistoDeCaixa(estado, mensagens, pai);
                       });
     catalogo.registar(QStringLiteral("Configurações"),
                       [&estado, &mensagens](QWidget* pai) -> QWidget* {
@@ -106,6 +112,10 @@ void WMenu::criarMenu() {
     movimentos->setObjectName(QStringLiteral("mnuMovimentos"));
     accao(movimentos, "Testes", QStringLiteral("&Mesas / Facturação"),
           [this] { abrirFacturacao(); });
+    accao(movimentos, "mnuRegistoCaixa", QStringLiteral("&Registo de Caixa..."), [this] {
+        abrirDialogo(new cash::frmRegistoDeCaixa(estado_, mensagens_, this),
+                     QStringLiteral("Registo de Caixa"));
+    });
     QMenu* utilitarios = menuBar()->addMenu(QStringLiteral("&Utilitários"));
     utilitarios->setObjectName(QStringLiteral("mnuUtilitarios"));
     accao(utilitarios, "DefBott_Fonte", QStringLiteral("&Configurações..."),
@@ -113,6 +123,10 @@ void WMenu::criarMenu() {
     accao(utilitarios, "mnuAcessos", QStringLiteral("&Acessos dos Utilizadores..."),
           [this] { editarAcessos(); });
     accao(utilitarios, "mnuAbreCaixa", QStringLiteral("Abrir &Gaveta"), [this] { abrirGaveta(); });
+    accao(utilitarios, "mnuAlterarCaixa", QStringLiteral("Alterar &Caixa..."), [this] {
+        cash::frmAltCaixa janela(estado_, mensagens_, this);
+        if (janela.exec() == QDialog::Accepted) actualizaBarraEstado();
+    });
     accao(utilitarios, "mnuDefImpressorass", QStringLiteral("Definir &Impressora..."),
           [this] { configurarImpressora(); });
     QMenu* utilizador = menuBar()->addMenu(QStringLiteral("U&tilizador"));
@@ -128,7 +142,7 @@ void WMenu::criarMenu() {
 bool WMenu::carregar() {
     devices::MostraAguardeNoDisplay(estado_, linha_);
     if (!carregarMenuPrincipal(estado_, mensagens_)) return false;
-    aplicaCorFundo(this, estado_.gUtilizador);
+    aplicaUtilizador();
     // The menu and the touch bar stand on the user's colour: their texts are light.
     for (QWidget* barra :
          {static_cast<QWidget*>(menuBar()), findChild<QWidget*>(QStringLiteral("barraTactil"))}) {
@@ -208,9 +222,15 @@ void WMenu::editarAcessos() {
 void WMenu::mudarUtilizador() {
     frmMudaUtilizador janela(estado_, mensagens_, this);
     if (janela.Muda_de_Utilizador()) {
-        aplicaCorFundo(this, estado_.gUtilizador);
+        aplicaUtilizador();
         actualizaBarraEstado();
     }
+}
+
+void WMenu::aplicaUtilizador() {
+    aplicaCorFundo(this, estado_.gUtilizador);
+    findChild<QAction*>(QStringLiteral("mnuAlterarCaixa"))
+        ->setEnabled(alteraCaixaPermitido(estado_));
 }
 
 void WMenu::actualizaBarraEstado() {

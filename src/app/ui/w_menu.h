@@ -58,6 +58,8 @@ class WMenu : public QMainWindow {
     void configurar();
     void editarAcessos();
     void mudarUtilizador();
+    // The user's colour and the entries only some users may use.
+    void aplicaUtilizador();
     void abrirGaveta();
     void programaCozinha();
 
