@@ -13,8 +13,9 @@
 #include "cash/ui/frm_registo_de_caixa.h"
 #include "common/ui/estilo_tactil.h"
 #include "common/versao.h"
-#include "devices/gaveta.h"
+#include "devices/escolha_impressao.h"
 #include "devices/mostra_no_display.h"
+#include "documents/ui/frm_factura_cli_2via.h"
 #include "pos/ui/frm_facturacao.h"
 
 #include <QApplication>
@@ -45,6 +46,10 @@ CatalogoJanelas catalogoPrograma(Estado& estado, MessagePort& mensagens,
     catalogo.registar(QStringLiteral("Movimentos Gerais"),
                       [&estado, &linha](QWidget* pai) -> QWidget* {
                           return new pos::frmFacturacao(estado, linha, pai);
+                      });
+    catalogo.registar(QStringLiteral("Segundas Vias de Documentos"),
+                      [&estado, &mensagens, &linha](QWidget* pai) -> QWidget* {
+                          return new documents::frmFacturaCli2Via(estado, mensagens, linha, pai);
                       });
     catalogo.registar(QStringLiteral("Registo de Caixa"),
                       [&estado, &mensagens](QWidget* pai) -> QWidget* {
@@ -112,6 +117,11 @@ void WMenu::criarMenu() {
     movimentos->setObjectName(QStringLiteral("mnuMovimentos"));
     accao(movimentos, "Testes", QStringLiteral("&Mesas / Facturação"),
           [this] { abrirFacturacao(); });
+    accao(movimentos, "mnuFacturaCli2Via", QStringLiteral("&Segundas Vias de Documentos..."),
+          [this] {
+              auto* janela = new documents::frmFacturaCli2Via(estado_, mensagens_, linha_, area_);
+              abrirJanela(janela, QStringLiteral("Segundas Vias de Documentos"));
+          });
     accao(movimentos, "mnuRegistoCaixa", QStringLiteral("&Registo de Caixa..."), [this] {
         abrirDialogo(new cash::frmRegistoDeCaixa(estado_, mensagens_, this),
                      QStringLiteral("Registo de Caixa"));
@@ -166,9 +176,7 @@ void WMenu::programaCozinha() {
 void WMenu::abrirGaveta() {
     // The drawer may take a moment (a driver job): the hourglass says the press was taken.
     QApplication::setOverrideCursor(Qt::WaitCursor);
-    devices::AbreGaveta(estado_.gConn, estado_.gUtilizador,
-                        {linha_, posto::ConfigRest_CaixaDinheiro.ler(), QString()}, QString(),
-                        true);
+    devices::AbreGavetaTalao(estado_, linha_, QString(), true);
     QApplication::restoreOverrideCursor();
 }
 
