@@ -10,7 +10,9 @@
 #include "pos/codigo_barras.h"
 #include "pos/colunas_tab.h"
 #include "pos/cozinha/historico_copa.h"
+#include "pos/fecho_tab.h"
 #include "pos/grupos.h"
+#include "pos/imprime_doc_aberto.h"
 #include "pos/mover_tab.h"
 #include "pos/pendentes_tab.h"
 #include "pos/produtos_facturacao.h"
@@ -61,6 +63,7 @@ frmFacturacao::frmFacturacao(app::Estado& estado, devices::LinhaSerie& linha, QW
       mensagens_(this),
       perguntas_(estado, mensagens_, this),
       tab_(estado, mensagens_, linha),
+      perguntasFecho_(estado, mensagens_, linha, perguntas_, this),
       nivel_(app::posto::NivelEmenta.ler()) {
     setObjectName(QStringLiteral("frmFacturacao"));
     setWindowTitle(QStringLiteral("Movimentos Gerais"));
@@ -223,6 +226,21 @@ QWidget* frmFacturacao::criaAccoes() {
                                      eliminar, cmdPedidosCozinha_, sair};
     for (int i = 0; i < botoes.size(); ++i)
         l->addWidget(botoes[i], 0, i);
+    // The closing buttons, under the tab's lines and larger than the rest.
+    auto* impDocAberto = botao("cmdImpDocAberto", QStringLiteral("Imp. Conta"));
+    auto* talao = botao("cmdTalao", QStringLiteral("Talão"));
+    auto* gravarDoc = botao("cmdGravarDoc", QStringLiteral("Fechar"));
+    // A style sheet drops the window's font: the button names its own.
+    gravarDoc->setStyleSheet(
+        QStringLiteral("font-size: 18pt; font-weight: bold; background: #2e9e44; color: white;"));
+    for (QPushButton* b : {impDocAberto, talao, gravarDoc})
+        b->setMinimumHeight(72);
+    l->addWidget(impDocAberto, 1, 4, 1, 1);
+    l->addWidget(talao, 1, 5, 1, 1);
+    l->addWidget(gravarDoc, 1, 6, 1, 2);
+    connect(impDocAberto, &QPushButton::clicked, this, &frmFacturacao::cmdImpDocAberto);
+    connect(talao, &QPushButton::clicked, this, &frmFacturacao::cmdTalao);
+    connect(gravarDoc, &QPushButton::clicked, this, &frmFacturacao::cmdGravarDoc);
     connect(cmdQty_, &QPushButton::clicked, this, &frmFacturacao::cmdQty);
     connect(cmdPreco_, &QPushButton::clicked, this, &frmFacturacao::cmdPreco);
     connect(observa, &QPushButton::clicked, this, &frmFacturacao::cmdObserva);
@@ -355,6 +373,7 @@ void frmFacturacao::produtoPremido(QListWidgetItem* item) {
     QApplication::processEvents();
     const std::int64_t n = PremirProduto(tab_, perguntas_, codigo);
     setEnabled(true);
+    perguntasFecho_.fechaTroco();
     if (n > 0) {
         cmdQty_->setText(QStringLiteral("Qty"));
         cmdPreco_->setText(QStringLiteral("Preço"));
@@ -448,6 +467,28 @@ void frmFacturacao::cmdPedidosCozinha() {
     APedidos pedidos(estado_, mensagens_, teclado, this);
     pedidos.exec();
     cmdPedidosCozinha_->setEnabled(cozinha::ExistemPedidosPorLibertar(estado_));
+}
+
+void frmFacturacao::mostraTudo() {
+    mostraCabecalho();
+    mostraLista();
+}
+
+// The dialogs of the closing are modal: the screen stays enabled, since a disabled parent would
+// disable them too.
+void frmFacturacao::cmdGravarDoc() {
+    FecharTab(tab_, perguntasFecho_);
+    mostraTudo();
+}
+
+void frmFacturacao::cmdTalao() {
+    FecharComTalao(tab_, perguntasFecho_);
+    mostraTudo();
+}
+
+void frmFacturacao::cmdImpDocAberto() {
+    ImprimeDocAberto(tab_);
+    mostraTudo();
 }
 
 void frmFacturacao::closeEvent(QCloseEvent* evento) {

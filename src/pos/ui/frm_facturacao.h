@@ -4,6 +4,7 @@
 #include "common/ui/mensagens_janela.h"
 #include "devices/linha_serie.h"
 #include "pos/tab.h"
+#include "pos/ui/perguntas_fecho_janela.h"
 #include "pos/ui/perguntas_janela.h"
 
 #include <QLabel>
@@ -71,11 +72,17 @@ class frmFacturacao : public QWidget {
     void cmdAlterarTipo();
     void cmdImputCodigoBarras();
     void cmdPedidosCozinha();
+    void cmdGravarDoc();
+    void cmdTalao();
+    void cmdImpDocAberto();
+    // After a closing: the next customer's table (or none) and its lines.
+    void mostraTudo();
 
     app::Estado& estado_;
     MensagensJanela mensagens_;
     PerguntasJanela perguntas_;
     Tab tab_;
+    PerguntasFechoJanela perguntasFecho_;
     QString nivel_;
     QString grupo_ = QStringLiteral("000");
     bool aPreencher_ = false;
