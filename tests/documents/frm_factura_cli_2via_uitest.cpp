@@ -21,7 +21,6 @@ using testing::noDialogo;
 class JanelaSegundaVia : public devices::teste::TalaoTeste {
   protected:
     void SetUp() override {
-        testing::aplicacaoTeste();
         TalaoTeste::SetUp();
         devices::teste::escreveDocumento(conn_);
         devices::teste::OpcoesDocumento factura;
@@ -35,6 +34,8 @@ class JanelaSegundaVia : public devices::teste::TalaoTeste {
 
     QTemporaryDir chaves_;
     QString nota_;
+    // The application exists before the window is made.
+    QApplication& aplicacao_ = testing::aplicacaoTeste();
     frmFacturaCli2Via janela_{estado_, mensagens_, linha_};
 };
 

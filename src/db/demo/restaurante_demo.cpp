@@ -24,8 +24,6 @@ void escreveParametros(Escritor& e, const QString& nomeEmpresa) {
         {QStringLiteral("mes"), QStringLiteral("%1").arg(hoje.month(), 2, 10, QLatin1Char('0'))},
         {QStringLiteral("cambiodef"), QStringLiteral("EUR")},
         {QStringLiteral("cambioeuro"), QStringLiteral("EUR")},
-        // The demo's rates are foreign units per euro.
-        {QStringLiteral("FormulaCalcCambioB"), 1},
         {QStringLiteral("casadec"), 2},
         {QStringLiteral("casadecpreco"), 3},
         {QStringLiteral("casadecquant"), 3},
