@@ -3,29 +3,18 @@
 // bare transaction of the same inserts and updates on the same connection; on the embedded demo
 // company, and on PostgreSQL when BRASEL_TEST_PG names a server. Each closing is timed on its own:
 // the median and the 99th percentile are reported as counters (microseconds).
-#include "app/carrega_parametros.h"
-#include "db/connections.h"
-#include "db/demo/restaurante_demo.h"
-#include "db/schema/servidor.h"
+#include "apoio_bench.h"
 #include "devices/definicao_impressora.h"
 #include "impressora.h"
 #include "pos/abertura_mesa.h"
 #include "pos/adicionar_produto.h"
 #include "pos/fecho_tab.h"
-#include "support/apoio_arranque.h"
 #include "support/chave_teste.h"
 #include "support/devsim_teste.h"
-#include "support/empresa_teste.h"
 #include "support/mensagens_gravadas.h"
-#include "support/servidor_pg.h"
 
-#include <QCoreApplication>
 #include <QDate>
 
-#include <benchmark/benchmark.h>
-
-#include <algorithm>
-#include <chrono>
 #include <memory>
 #include <optional>
 #include <vector>
@@ -33,30 +22,12 @@
 namespace {
 
 using namespace brasel;
+using bench::cronometra;
+using bench::Medidas;
 
 constexpr int kLinhas = 10;
 const char* const kProdutos[] = {"B001", "B003", "B006", "B010", "B015",
                                  "P002", "P005", "P011", "S001", "S003"};
-
-// The tab's questions are never asked for the products pressed here.
-class SemPerguntas : public pos::PerguntasTab {
-  public:
-    std::optional<Currency> pedirValor(const QString&) override { return std::nullopt; }
-    std::optional<QString> pedirTexto(const QString&, const QString&, bool) override {
-        return std::nullopt;
-    }
-    pos::PrecoQuant pedir(const QString&, const pos::PropostaPrecoQuant&) override { return {}; }
-    Currency pesa(Currency) override { return {}; }
-    bool passwordSupervisor() override { return false; }
-    std::optional<QString> mesa() override { return std::nullopt; }
-    std::optional<QString> tipoMovimento() override { return std::nullopt; }
-    std::optional<pos::LoteEscolhido> lote(const QString&, Currency) override {
-        return std::nullopt;
-    }
-    std::optional<pos::ReferenciaEscolhida> referencia(const QString&) override {
-        return std::nullopt;
-    }
-};
 
 // The cashier: paid in cash with the exact amount, one purchase ticket.
 class Caixa : public pos::PerguntasFecho {
@@ -82,31 +53,13 @@ class Caixa : public pos::PerguntasFecho {
     }
 };
 
-struct Medidas {
-    std::vector<double> us;
-
-    void relata(benchmark::State& state) {
-        if (us.empty()) return;
-        std::sort(us.begin(), us.end());
-        state.counters["mediana_us"] = us[us.size() / 2];
-        state.counters["p99_us"] = us[std::min(us.size() - 1, us.size() * 99 / 100)];
-    }
-};
-
-template <class F>
-double cronometra(F&& f) {
-    const auto t0 = std::chrono::steady_clock::now();
-    f();
-    return std::chrono::duration<double, std::micro>(std::chrono::steady_clock::now() - t0).count();
-}
-
 // Table M01's tab under the cash-sale type, its receipts going to a simulated ticket printer.
 struct Cenario {
     app::Estado* estado = nullptr;
     testing::MensagensGravadas mensagens;
     testing::DevsimTeste devsim;
     std::unique_ptr<devices::LinhaSerie> linha;
-    SemPerguntas perguntas;
+    bench::SemPerguntas perguntas;
     Caixa caixa;
     std::unique_ptr<pos::Tab> tab;
 
@@ -217,110 +170,32 @@ void transaccoesNuas(benchmark::State& state, Cenario& c) {
     m.relata(state);
 }
 
-// The embedded demo company, built once.
-struct Embutida {
-    testing::DefinicoesTemporarias definicoes;
-    testing::EmpresaTeste empresa{true};
-    Cenario cenario;
-    bool pronta = false;
-};
-
-Embutida& embutida() {
-    static Embutida* e = [] {
-        auto* nova = new Embutida;
-        nova->pronta = nova->cenario.abre(nova->empresa.estado());
-        return nova;
-    }();
-    return *e;
-}
+// The embedded demo company, and a PostgreSQL one of its own when a server is named.
+bench::Empresas<Cenario> gEmpresas([](app::Estado& e, Cenario& c) { return c.abre(e); },
+                                   QLatin1Char('F'));
 
 void BM_FechoMesaEmbutida(benchmark::State& state) {
-    Embutida& e = embutida();
-    if (!e.pronta) return state.SkipWithError("empresa por preparar");
-    fechos(state, e.cenario);
+    if (auto* c = gEmpresas.embutida(state)) fechos(state, *c);
 }
 BENCHMARK(BM_FechoMesaEmbutida)->Unit(benchmark::kMicrosecond)->Iterations(300);
 
 void BM_TransaccaoNuaEmbutida(benchmark::State& state) {
-    Embutida& e = embutida();
-    if (!e.pronta) return state.SkipWithError("empresa por preparar");
-    transaccoesNuas(state, e.cenario);
+    if (auto* c = gEmpresas.embutida(state)) transaccoesNuas(state, *c);
 }
 BENCHMARK(BM_TransaccaoNuaEmbutida)->Unit(benchmark::kMicrosecond)->Iterations(300);
 
-// The same on PostgreSQL: a company of its own with the demo restaurant.
-struct Postgres {
-    testing::DefinicoesTemporarias definicoes;
-    testing::MensagensGravadas mensagens;
-    app::Estado estado;
-    Cenario cenario;
-    QString empresa;
-    std::optional<testing::ServidorPg> pg = testing::servidorPg();
-    bool criada = false;
-    bool pronta = false;
-
-    Postgres() {
-        if (!pg) return;
-        const auto servidor = db::ServerAddress::parse(pg->servidor);
-        const db::schema::Credenciais admin{pg->login, pg->password};
-        empresa = QStringLiteral("F%1").arg(QCoreApplication::applicationPid() % 1000, 3, 10,
-                                            QLatin1Char('0'));
-        QString erro;
-        if (!servidor ||
-            !(criada = db::schema::criarEmpresa(*servidor, admin, empresa, {}, &erro)) ||
-            !db::schema::abrirEmpresa(estado.gConn, *servidor, admin, empresa, &erro) ||
-            !db::demo::carregarRestauranteDemo(estado.gConn, pg->password, {}, &erro))
-            return;
-        estado.gServidor = pg->servidor;
-        estado.gEmpresa = empresa;
-        estado.gLogin = QStringLiteral("SUPERVISOR");
-        estado.gUtilizador = QStringLiteral("01");
-        app::CarregaParametros(estado, mensagens, {});
-        pronta = cenario.abre(estado);
-    }
-
-    // The benchmark's company goes when the program ends.
-    void apagar() {
-        cenario.tab.reset();
-        estado.gConn.close();
-        if (!criada) return;
-        db::Connection master;
-        QString password = pg->password;
-        if (db::Abre_Connexao(master, pg->servidor, QStringLiteral("Master"), pg->login, password,
-                              {}, QStringLiteral("SQL"), 30, 10, true))
-            master.exec(QStringLiteral("DROP DATABASE IF EXISTS %1 WITH (FORCE)")
-                            .arg(db::nomeBaseDados(empresa).toLower()));
-    }
-};
-
-Postgres* gPostgres = nullptr;
-
-Postgres& postgres() {
-    if (!gPostgres) gPostgres = new Postgres;
-    return *gPostgres;
-}
-
 void BM_FechoMesaPostgres(benchmark::State& state) {
-    Postgres& p = postgres();
-    if (!p.pronta) return state.SkipWithError("BRASEL_TEST_PG não definido ou servidor recusou");
-    fechos(state, p.cenario);
+    if (auto* c = gEmpresas.postgres(state)) fechos(state, *c);
 }
 BENCHMARK(BM_FechoMesaPostgres)->Unit(benchmark::kMicrosecond)->Iterations(200);
 
 void BM_TransaccaoNuaPostgres(benchmark::State& state) {
-    Postgres& p = postgres();
-    if (!p.pronta) return state.SkipWithError("BRASEL_TEST_PG não definido ou servidor recusou");
-    transaccoesNuas(state, p.cenario);
+    if (auto* c = gEmpresas.postgres(state)) transaccoesNuas(state, *c);
 }
 BENCHMARK(BM_TransaccaoNuaPostgres)->Unit(benchmark::kMicrosecond)->Iterations(200);
 
 }  // namespace
 
 int main(int argc, char** argv) {
-    QCoreApplication aplicacao(argc, argv);
-    benchmark::Initialize(&argc, argv);
-    benchmark::RunSpecifiedBenchmarks();
-    benchmark::Shutdown();
-    if (gPostgres) gPostgres->apagar();
-    return 0;
+    return bench::correBenchmarks(argc, argv, gEmpresas);
 }

@@ -40,13 +40,15 @@ class LancMovCaixaJanela : public ::testing::Test {
 
     static int linhaDe(QTableWidget* lista, const char* codigo) {
         for (int i = 0; i < lista->rowCount(); ++i) {
-            if (lista->item(i, 1)->text() == QString::fromLatin1(codigo)) return i;
+            if (lista->item(i, ListaFormasValor::Codigo)->text() == QString::fromLatin1(codigo))
+                return i;
         }
         ADD_FAILURE() << codigo;
         return 0;
     }
     static void escreve(QTableWidget* lista, const char* codigo, const char* texto) {
-        lista->item(linhaDe(lista, codigo), 3)->setText(QString::fromUtf8(texto));
+        lista->item(linhaDe(lista, codigo), ListaFormasValor::Valor)
+            ->setText(QString::fromUtf8(texto));
     }
 
     testing::DefinicoesTemporarias definicoes_;

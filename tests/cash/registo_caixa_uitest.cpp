@@ -72,13 +72,18 @@ class RegistoCaixaJanela : public ::testing::Test {
 
     static int linhaDe(QTableWidget* lista, const char* codigo) {
         for (int i = 0; i < lista->rowCount(); ++i) {
-            if (lista->item(i, 0)->text() == QString::fromLatin1(codigo)) return i;
+            if (lista->item(i, ListaFormasValor::Codigo)->text() == QString::fromLatin1(codigo))
+                return i;
         }
         ADD_FAILURE() << codigo;
         return 0;
     }
     static QString valorDe(QTableWidget* lista, const char* codigo) {
-        return lista->item(linhaDe(lista, codigo), 2)->text();
+        return lista->item(linhaDe(lista, codigo), ListaFormasValor::Valor)->text();
+    }
+    static void escreve(QTableWidget* lista, const char* codigo, const char* texto) {
+        lista->item(linhaDe(lista, codigo), ListaFormasValor::Valor)
+            ->setText(QString::fromUtf8(texto));
     }
     QHash<QString, Currency> contado(const char* data) {
         return CarregaRegistoCaixa(e_.gConn, QStringLiteral("01"), QString::fromLatin1(data))
@@ -100,7 +105,10 @@ TEST_F(RegistoCaixaJanela, CountsReloadsAndCountsAgain) {
     EXPECT_EQ(filho<QLabel>(&janela, "lblCaixa")->text(), QStringLiteral("Caixa principal"));
     janela.dtpData()->setDate(QDate(2026, 3, 14));
     ASSERT_EQ(lista->rowCount(), 4);
-    lista->item(linhaDe(lista, "NU"), 2)->setText(QStringLiteral("20,5"));
+    EXPECT_TRUE(lista->isColumnHidden(0));
+    EXPECT_EQ(lista->horizontalHeaderItem(1)->text(), QStringLiteral("Código"));
+    EXPECT_EQ(lista->horizontalHeaderItem(3)->text(), QStringLiteral("Valor"));
+    escreve(lista, "NU", "20,5");
     lista->selectRow(linhaDe(lista, "MB"));
     teclado_.respostas = {V("5")};
     clicar(&janela, "cmdValor");
@@ -120,18 +128,18 @@ TEST_F(RegistoCaixaJanela, CountsReloadsAndCountsAgain) {
     EXPECT_EQ(valorDe(lista, "NU"), QStringLiteral("20.50"));
     EXPECT_EQ(valorDe(lista, "MB"), QStringLiteral("5.00"));
 
-    lista->item(linhaDe(lista, "NU"), 2)->setText(QStringLiteral("10"));
-    lista->item(linhaDe(lista, "MB"), 2)->setText(QString());
+    escreve(lista, "NU", "10");
+    escreve(lista, "MB", "");
     clicar(&janela, "cmdActualizar");
     EXPECT_EQ(contado("2026-03-14").value(QStringLiteral("NU")), V("10"));
     EXPECT_EQ(contado("2026-03-14").value(QStringLiteral("MB")), V("0"));
     EXPECT_TRUE(mensagens_.mensagens().isEmpty()) << mensagens_.textos().join(u'|').toStdString();
 
     // A count that is not a number, or no register, changes nothing.
-    lista->item(linhaDe(lista, "NU"), 2)->setText(QStringLiteral("1.2.3"));
+    escreve(lista, "NU", "1.2.3");
     clicar(&janela, "cmdActualizar");
     janela.txtCaixa()->clear();
-    lista->item(linhaDe(lista, "NU"), 2)->setText(QStringLiteral("3"));
+    escreve(lista, "NU", "3");
     clicar(&janela, "cmdActualizar");
     EXPECT_EQ(mensagens_.textos(), (QStringList{QStringLiteral("Valor Inválido!"),
                                                 QStringLiteral("Não definiu o Caixa!")}));

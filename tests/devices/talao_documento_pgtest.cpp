@@ -1,6 +1,5 @@
 // A receipt's readings on a PostgreSQL company, where every bound value must find its column's
 // type and the text comparisons of the document list must agree with the embedded engine.
-#include "db/demo/restaurante_demo.h"
 #include "devices/conta_provisoria.h"
 #include "devices/documento_impresso.h"
 #include "devices/talao_teste.h"
@@ -22,13 +21,10 @@ class TalaoDocumentoPg : public ::testing::Test {
     void SetUp() override {
         if (!testing::servidorPg()) GTEST_SKIP() << "BRASEL_TEST_PG não definido";
         ASSERT_TRUE(empresa_.pronta()) << empresa_.erro().toStdString();
-        QString erro;
-        ASSERT_TRUE(db::demo::carregarRestauranteDemo(conn_, QStringLiteral("x"), {}, &erro))
-            << erro.toStdString();
         teste::escreveDocumento(conn_);
     }
 
-    testing::EmpresaPg empresa_{QLatin1Char('T')};
+    testing::EmpresaPg empresa_{QLatin1Char('D'), true};
     app::Estado& estado_ = empresa_.estado();
     db::Connection& conn_ = estado_.gConn;
     testing::MensagensGravadas mensagens_;

@@ -30,7 +30,7 @@ class AssinaturaPg : public ::testing::Test {
         EXPECT_TRUE(*ok) << texto.toStdString();
     }
 
-    testing::EmpresaPg empresa_{QLatin1Char('S')};
+    testing::EmpresaPg empresa_{QLatin1Char('A')};
     app::Estado& e = empresa_.estado();
 };
 

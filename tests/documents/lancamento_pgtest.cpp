@@ -34,7 +34,7 @@ class LancamentoPg : public ::testing::Test {
             "('K1','Vinho d''Ouro',1,'2.5','07','GAR',30)")));
     }
 
-    testing::EmpresaPg empresa_{QLatin1Char('L')};
+    testing::EmpresaPg empresa_{QLatin1Char('M')};
     app::Estado& e = empresa_.estado();
 };
 

@@ -38,7 +38,7 @@ class LookupsPg : public ::testing::Test {
         texto = pg->servidor;
         servidor = db::ServerAddress::parse(texto).value_or(db::ServerAddress{});
         admin = {pg->login, pg->password};
-        empresa = QStringLiteral("L%1").arg(QCoreApplication::applicationPid() % 1000, 3, 10,
+        empresa = QStringLiteral("P%1").arg(QCoreApplication::applicationPid() % 1000, 3, 10,
                                             QLatin1Char('0'));
         QString erro;
         ASSERT_TRUE(db::schema::criarEmpresa(servidor, admin, empresa, {}, &erro))

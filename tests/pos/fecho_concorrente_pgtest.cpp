@@ -3,8 +3,6 @@
 // before it, and the till holds exactly what the documents say. Each workstation is a process of
 // its own (this program run again with the workstation's test), as in a restaurant.
 #include "app/carrega_parametros.h"
-#include "db/connections.h"
-#include "db/demo/restaurante_demo.h"
 #include "db/schema/servidor.h"
 #include "documents/assinatura.h"
 #include "pos/abertura_mesa.h"
@@ -12,9 +10,9 @@
 #include "pos/fecho_tab.h"
 #include "pos/tab_teste.h"
 #include "support/chave_teste.h"
+#include "support/empresa_pg.h"
 #include "support/servidor_pg.h"
 
-#include <QCoreApplication>
 #include <QDate>
 #include <QFileInfo>
 #include <QProcess>
@@ -92,42 +90,14 @@ TEST(FechoConcorrente, Posto) {
 class FechoConcorrenteSala : public ::testing::Test {
   protected:
     void SetUp() override {
-        pg_ = testing::servidorPg();
-        if (!pg_) GTEST_SKIP() << "BRASEL_TEST_PG não definido";
+        if (!testing::servidorPg()) GTEST_SKIP() << "BRASEL_TEST_PG não definido";
         if (!env(kEnvPosto).isEmpty()) GTEST_SKIP() << "um posto não lança outros";
-        servidor_ = db::ServerAddress::parse(pg_->servidor).value_or(db::ServerAddress{});
-        empresa_ = QStringLiteral("K%1").arg(QCoreApplication::applicationPid() % 1000, 3, 10,
-                                             QLatin1Char('0'));
-        QString erro;
-        ASSERT_TRUE(
-            db::schema::criarEmpresa(servidor_, {pg_->login, pg_->password}, empresa_, {}, &erro))
-            << erro.toStdString();
-        criada_ = true;
-        ASSERT_TRUE(abreEmpresa(estado_, *pg_, empresa_, &erro)) << erro.toStdString();
-        ASSERT_TRUE(db::demo::carregarRestauranteDemo(estado_.gConn, pg_->password, {}, &erro))
-            << erro.toStdString();
-        testing::MensagensGravadas m;
-        app::CarregaParametros(estado_, m, {});
+        ASSERT_TRUE(empresa_.pronta()) << empresa_.erro().toStdString();
         testing::usaChaveTeste(estado_);
     }
 
-    void TearDown() override {
-        estado_.gConn.close();
-        if (!criada_) return;
-        db::Connection master;
-        QString password = pg_->password;
-        if (db::Abre_Connexao(master, pg_->servidor, QStringLiteral("Master"), pg_->login, password,
-                              {}, QStringLiteral("SQL"), 30, 10, true)) {
-            master.exec(QStringLiteral("DROP DATABASE IF EXISTS %1 WITH (FORCE)")
-                            .arg(db::nomeBaseDados(empresa_).toLower()));
-        }
-    }
-
-    std::optional<testing::ServidorPg> pg_;
-    db::ServerAddress servidor_;
-    QString empresa_;
-    bool criada_ = false;
-    app::Estado estado_;
+    testing::EmpresaPg empresa_{QLatin1Char('K'), true};
+    app::Estado& estado_ = empresa_.estado();
 };
 
 TEST_F(FechoConcorrenteSala, QuatroPostosNumeramSemFalhasNemRepeticoes) {
@@ -142,7 +112,7 @@ TEST_F(FechoConcorrenteSala, QuatroPostosNumeramSemFalhasNemRepeticoes) {
         auto processo = std::make_unique<QProcess>();
         QProcessEnvironment ambiente = QProcessEnvironment::systemEnvironment();
         ambiente.insert(QString::fromLatin1(kEnvPosto), QString::number(posto));
-        ambiente.insert(QString::fromLatin1(kEnvEmpresa), empresa_);
+        ambiente.insert(QString::fromLatin1(kEnvEmpresa), empresa_.empresa());
         ambiente.insert(QString::fromLatin1(kEnvChave), testing::ficheiroChaveTeste());
         processo->setProcessEnvironment(ambiente);
         processo->setProcessChannelMode(QProcess::MergedChannels);

@@ -1,13 +1,8 @@
 // Closing a tab on PostgreSQL: a partial close numbered past a used number under the closing
 // lock, its cash row and log; a failed signature rolls every statement back.
-#include "app/carrega_parametros.h"
-#include "db/connections.h"
-#include "db/demo/restaurante_demo.h"
-#include "db/schema/servidor.h"
 #include "pos/fecho_teste.h"
+#include "support/empresa_pg.h"
 #include "support/servidor_pg.h"
-
-#include <QCoreApplication>
 
 namespace brasel::pos {
 namespace {
@@ -15,44 +10,14 @@ namespace {
 class FechoPg : public ::testing::Test {
   protected:
     void SetUp() override {
-        pg_ = testing::servidorPg();
-        if (!pg_) GTEST_SKIP() << "BRASEL_TEST_PG não definido";
-        servidor_ = db::ServerAddress::parse(pg_->servidor).value_or(db::ServerAddress{});
-        admin_ = {pg_->login, pg_->password};
-        empresa_ = QStringLiteral("K%1").arg(QCoreApplication::applicationPid() % 1000, 3, 10,
-                                             QLatin1Char('0'));
-        QString erro;
-        ASSERT_TRUE(db::schema::criarEmpresa(servidor_, admin_, empresa_, {}, &erro))
-            << erro.toStdString();
-        criada_ = true;
-        ASSERT_TRUE(db::schema::abrirEmpresa(estado_.gConn, servidor_, admin_, empresa_, &erro))
-            << erro.toStdString();
-        ASSERT_TRUE(db::demo::carregarRestauranteDemo(estado_.gConn, pg_->password, {}, &erro))
-            << erro.toStdString();
-        estado_.gServidor = pg_->servidor;
-        estado_.gEmpresa = empresa_;
-        estado_.gLogin = QStringLiteral("SUPERVISOR");
-        estado_.gUtilizador = QStringLiteral("01");
-        app::CarregaParametros(estado_, m_, {});
+        if (!testing::servidorPg()) GTEST_SKIP() << "BRASEL_TEST_PG não definido";
+        ASSERT_TRUE(empresa_.pronta()) << empresa_.erro().toStdString();
         estado_.gVariosPagaComo = false;
         testing::usaChaveTeste(estado_);
         tab_ = std::make_unique<Tab>(estado_, m_, linha_);
         tab_->definirTipo(QStringLiteral("VD"));
         AbrirMesa(*tab_, QStringLiteral("M01"));
         m_.respostaFinal = true;
-    }
-
-    void TearDown() override {
-        tab_.reset();
-        estado_.gConn.close();
-        if (!criada_) return;
-        db::Connection master;
-        QString password = admin_.password;
-        if (db::Abre_Connexao(master, pg_->servidor, QStringLiteral("Master"), admin_.login,
-                              password, {}, QStringLiteral("SQL"), 30, 10, true)) {
-            master.exec(QStringLiteral("DROP DATABASE IF EXISTS %1 WITH (FORCE)")
-                            .arg(db::nomeBaseDados(empresa_).toLower()));
-        }
     }
 
     void adiciona(std::initializer_list<const char*> produtos) {
@@ -69,13 +34,9 @@ class FechoPg : public ::testing::Test {
         return r ? r->value(0).toString() : QString();
     }
 
-    std::optional<testing::ServidorPg> pg_;
-    db::ServerAddress servidor_;
-    db::schema::Credenciais admin_;
-    QString empresa_;
-    bool criada_ = false;
     testing::DefinicoesTemporarias definicoes_;
-    app::Estado estado_;
+    testing::EmpresaPg empresa_{QLatin1Char('Q'), true};
+    app::Estado& estado_ = empresa_.estado();
     testing::MensagensGravadas m_;
     devices::LinhaSerie linha_;
     teste::PerguntasGravadas p_;

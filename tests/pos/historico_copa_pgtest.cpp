@@ -30,7 +30,7 @@ class HistoricoCopaPg : public ::testing::Test {
             QStringLiteral("insert into Clientes (Codigo, Descricao) values ('M01','Mesa 1')")));
     }
 
-    testing::EmpresaPg empresa_{QLatin1Char('K')};
+    testing::EmpresaPg empresa_{QLatin1Char('H')};
     db::Sessao& estado_ = empresa_.estado();
 };
 

@@ -1,19 +1,14 @@
 // The tab on PostgreSQL: lines added, read back all at once (their taxes are asked while the
 // lines are read), a quote in a table code and a note, and the last line's deletion; the
 // location and lots a line is taken from, and another region's line kept by its user.
-#include "app/carrega_parametros.h"
-#include "db/connections.h"
-#include "db/demo/restaurante_demo.h"
-#include "db/schema/servidor.h"
 #include "pos/abertura_mesa.h"
 #include "pos/adicionar_produto.h"
 #include "pos/adicionar_produto_localizacao.h"
 #include "pos/adicionar_produto_lote.h"
 #include "pos/alteracao_linhas.h"
 #include "pos/tab_teste.h"
+#include "support/empresa_pg.h"
 #include "support/servidor_pg.h"
-
-#include <QCoreApplication>
 
 #include <tuple>
 #include <utility>
@@ -24,48 +19,14 @@ namespace {
 class TabPg : public ::testing::Test {
   protected:
     void SetUp() override {
-        pg_ = testing::servidorPg();
-        if (!pg_) GTEST_SKIP() << "BRASEL_TEST_PG não definido";
-        servidor_ = db::ServerAddress::parse(pg_->servidor).value_or(db::ServerAddress{});
-        admin_ = {pg_->login, pg_->password};
-        empresa_ = QStringLiteral("J%1").arg(QCoreApplication::applicationPid() % 1000, 3, 10,
-                                             QLatin1Char('0'));
-        QString erro;
-        ASSERT_TRUE(db::schema::criarEmpresa(servidor_, admin_, empresa_, {}, &erro))
-            << erro.toStdString();
-        criada_ = true;
-        ASSERT_TRUE(db::schema::abrirEmpresa(estado_.gConn, servidor_, admin_, empresa_, &erro))
-            << erro.toStdString();
-        ASSERT_TRUE(db::demo::carregarRestauranteDemo(estado_.gConn, pg_->password, {}, &erro))
-            << erro.toStdString();
-        estado_.gServidor = pg_->servidor;
-        estado_.gEmpresa = empresa_;
-        estado_.gLogin = QStringLiteral("SUPERVISOR");
-        estado_.gUtilizador = QStringLiteral("01");
-        app::CarregaParametros(estado_, m_, {});
+        if (!testing::servidorPg()) GTEST_SKIP() << "BRASEL_TEST_PG não definido";
+        ASSERT_TRUE(empresa_.pronta()) << empresa_.erro().toStdString();
         tab_ = std::make_unique<Tab>(estado_, m_, linha_);
     }
 
-    void TearDown() override {
-        tab_.reset();
-        estado_.gConn.close();
-        if (!criada_) return;
-        db::Connection master;
-        QString password = admin_.password;
-        if (db::Abre_Connexao(master, pg_->servidor, QStringLiteral("Master"), admin_.login,
-                              password, {}, QStringLiteral("SQL"), 30, 10, true)) {
-            master.exec(QStringLiteral("DROP DATABASE IF EXISTS %1 WITH (FORCE)")
-                            .arg(db::nomeBaseDados(empresa_).toLower()));
-        }
-    }
-
-    std::optional<testing::ServidorPg> pg_;
-    db::ServerAddress servidor_;
-    db::schema::Credenciais admin_;
-    QString empresa_;
-    bool criada_ = false;
     testing::DefinicoesTemporarias definicoes_;
-    app::Estado estado_;
+    testing::EmpresaPg empresa_{QLatin1Char('J'), true};
+    app::Estado& estado_ = empresa_.estado();
     testing::MensagensGravadas m_;
     devices::LinhaSerie linha_;
     teste::PerguntasGravadas p_;

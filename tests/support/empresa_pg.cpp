@@ -1,13 +1,16 @@
 #include "support/empresa_pg.h"
 
+#include "app/carrega_parametros.h"
 #include "db/connections.h"
+#include "db/demo/restaurante_demo.h"
+#include "support/mensagens_gravadas.h"
 #include "support/servidor_pg.h"
 
 #include <QCoreApplication>
 
 namespace brasel::testing {
 
-EmpresaPg::EmpresaPg(QChar letra) {
+EmpresaPg::EmpresaPg(QChar letra, bool demo) {
     const auto pg = servidorPg();
     if (!pg) return;
     texto_ = pg->servidor;
@@ -23,6 +26,12 @@ EmpresaPg::EmpresaPg(QChar letra) {
     estado_.gLogin = admin_.login;
     estado_.gPassword = admin_.password;
     estado_.gAutenticacao = QStringLiteral("SQL");
+    if (!pronta_ || !demo) return;
+    pronta_ = db::demo::carregarRestauranteDemo(estado_.gConn, admin_.password, {}, &erro_);
+    estado_.gLogin = QStringLiteral("SUPERVISOR");
+    estado_.gUtilizador = QStringLiteral("01");
+    MensagensGravadas mensagens;
+    if (pronta_) app::CarregaParametros(estado_, mensagens, {});
 }
 
 EmpresaPg::~EmpresaPg() {

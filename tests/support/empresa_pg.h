@@ -9,10 +9,12 @@ namespace brasel::testing {
 
 // A company of its own on the PostgreSQL server of the tests, with the full schema, dropped when
 // the object goes. Its code starts with `letra` and carries the process number, so test programs
-// running at once never share one.
+// running at once never share one. With `demo` it holds the demo restaurant (its users' password
+// is the administrator's) and the state is that of its supervisor "01" (login SUPERVISOR) with
+// the parameters loaded.
 class EmpresaPg {
   public:
-    explicit EmpresaPg(QChar letra);
+    explicit EmpresaPg(QChar letra, bool demo = false);
     ~EmpresaPg();
     EmpresaPg(const EmpresaPg&) = delete;
     EmpresaPg& operator=(const EmpresaPg&) = delete;

@@ -6,7 +6,6 @@
 #include "pos/ui/frm_teclado.h"
 
 #include <QHBoxLayout>
-#include <QHeaderView>
 #include <QPushButton>
 #include <QVBoxLayout>
 
@@ -14,21 +13,11 @@ namespace brasel::cash {
 
 namespace {
 
-enum Coluna { NumInterno, Codigo, Descricao, Parcial };
-
 QPushButton* botao(const char* nome, const QString& texto, QWidget* pai) {
     auto* b = new QPushButton(texto, pai);
     b->setObjectName(QString::fromLatin1(nome));
     b->setMinimumSize(180, 72);
     return b;
-}
-
-QTableWidgetItem* celula(const QString& texto, bool editavel = false) {
-    auto* item = new QTableWidgetItem(texto);
-    Qt::ItemFlags flags = Qt::ItemIsSelectable | Qt::ItemIsEnabled;
-    if (editavel) flags |= Qt::ItemIsEditable;
-    item->setFlags(flags);
-    return item;
 }
 
 }  // namespace
@@ -44,25 +33,8 @@ frmLancMovCaixa::frmLancMovCaixa(app::Estado& estado, MessagePort& mensagens, QW
     setObjectName(QStringLiteral("frmLancMovCaixa"));
     setWindowTitle(QStringLiteral("Formas de Pagamento"));
 
-    lvwFormas_ = new QTableWidget(0, 4, this);
-    lvwFormas_->setObjectName(QStringLiteral("lvwFormas"));
-    lvwFormas_->setHorizontalHeaderLabels({QStringLiteral("Nº Interno"), QStringLiteral("Código"),
-                                           QStringLiteral("Forma de Pagamento"),
-                                           QStringLiteral("Parcial")});
-    lvwFormas_->setColumnHidden(NumInterno, true);
-    lvwFormas_->setSelectionBehavior(QAbstractItemView::SelectRows);
-    lvwFormas_->setSelectionMode(QAbstractItemView::SingleSelection);
-    lvwFormas_->setEditTriggers(QAbstractItemView::DoubleClicked |
-                                QAbstractItemView::EditKeyPressed |
-                                QAbstractItemView::AnyKeyPressed);
-    lvwFormas_->verticalHeader()->hide();
-    lvwFormas_->verticalHeader()->setDefaultSectionSize(56);
-    lvwFormas_->horizontalHeader()->setSectionResizeMode(Descricao, QHeaderView::Stretch);
-    lvwFormas_->setColumnWidth(Codigo, 110);
-    lvwFormas_->setColumnWidth(Parcial, 180);
-    connect(lvwFormas_, &QTableWidget::itemChanged, this, [this](QTableWidgetItem* item) {
-        if (item->column() == Parcial) CalculaTot();
-    });
+    lvwFormas_ = new ListaFormasValor(QStringLiteral("Parcial"), estado_.param.casadec, this);
+    connect(lvwFormas_, &ListaFormasValor::valorAlterado, this, [this] { CalculaTot(); });
 
     lblTotalDoc_ = new QLabel(this);
     lblTotalDoc_->setObjectName(QStringLiteral("lblTotalDoc"));
@@ -77,7 +49,7 @@ frmLancMovCaixa::frmLancMovCaixa(app::Estado& estado, MessagePort& mensagens, QW
     auto* cmdTudo = botao("cmdTudo", QStringLiteral("&Tudo"), this);
     auto* cmdOK = botao("cmdOK", QStringLiteral("&OK"), this);
     auto* cmdCancelar = botao("cmdCancelar", QStringLiteral("&Cancelar"), this);
-    connect(cmdValor, &QPushButton::clicked, this, [this] { pedeValor(); });
+    connect(cmdValor, &QPushButton::clicked, this, [this] { lvwFormas_->pedeValor(teclado_); });
     connect(cmdTudo, &QPushButton::clicked, this, [this] { tudo(); });
     connect(cmdOK, &QPushButton::clicked, this, [this] { confirma(); });
     connect(cmdCancelar, &QPushButton::clicked, this, &QDialog::reject);
@@ -105,57 +77,23 @@ frmLancMovCaixa::~frmLancMovCaixa() = default;
 std::optional<std::vector<ParcialPagamento>> frmLancMovCaixa::Carregar(Currency totalDoc) {
     totalDoc_ = totalDoc;
     resultado_.clear();
-    if (!preencheLista()) {
+    const auto formas = FormasPagamento(estado_.gConn);
+    if (!formas || formas->empty()) {
         mensagens_.mensagem(QStringLiteral("Processo Incompleto!"), Icone::Critico);
         return std::nullopt;
     }
+    lvwFormas_->preenche(*formas);
     lblTotalDoc_->setText(NumeroParaTexto(totalDoc_, estado_.param.casadec));
     CalculaTot();
     if (exec() != QDialog::Accepted) return std::nullopt;
     return resultado_;
 }
 
-bool frmLancMovCaixa::preencheLista() {
-    const auto formas = FormasPagamento(estado_.gConn);
-    if (!formas || formas->empty()) return false;
-    const QSignalBlocker bloqueio(lvwFormas_);
-    lvwFormas_->setRowCount(static_cast<int>(formas->size()));
-    for (int i = 0; i < lvwFormas_->rowCount(); ++i) {
-        const FormaPagamento& f = (*formas)[static_cast<std::size_t>(i)];
-        lvwFormas_->setItem(i, NumInterno, celula(QString::number(f.numRegisto)));
-        lvwFormas_->setItem(i, Codigo, celula(f.codigo));
-        lvwFormas_->setItem(i, Descricao, celula(f.descricao));
-        auto* parcial = celula(QString(), true);
-        parcial->setTextAlignment(Qt::AlignRight | Qt::AlignVCenter);
-        lvwFormas_->setItem(i, Parcial, parcial);
-        mostraParte(i, Currency());
-    }
-    lvwFormas_->selectRow(0);
-    return true;
-}
-
-void frmLancMovCaixa::mostraParte(int linha, Currency valor) {
-    // Without grouping, so that the cell reads back as typed.
-    lvwFormas_->item(linha, Parcial)->setText(valor.toText(estado_.param.casadec));
-}
-
-std::optional<std::vector<ParcialPagamento>> frmLancMovCaixa::partes() const {
-    std::vector<ParcialPagamento> lista;
-    for (int i = 0; i < lvwFormas_->rowCount(); ++i) {
-        const pos::ValorTeclado v = pos::lerValorTeclado(lvwFormas_->item(i, Parcial)->text());
-        if (!v.valido) return std::nullopt;
-        lista.push_back({lvwFormas_->item(i, Codigo)->text(), v.valor.value_or(Currency())});
-    }
-    return lista;
-}
-
 std::optional<Currency> frmLancMovCaixa::CalculaTot() {
-    const auto lista = partes();
-    if (!lista) return std::nullopt;
+    const auto pago = lvwFormas_->total();
+    if (!pago) return std::nullopt;
     try {
-        Currency resto = totalDoc_;
-        for (const ParcialPagamento& p : *lista)
-            resto -= p.valor;
+        const Currency resto = totalDoc_ - *pago;
         lblResto_->setText(NumeroParaTexto(resto, estado_.param.casadec));
         return resto;
     } catch (const CurrencyOverflow&) {
@@ -167,26 +105,15 @@ void frmLancMovCaixa::tudo() {
     const int linha = lvwFormas_->currentRow();
     const auto resto = CalculaTot();
     if (linha < 0 || !resto) return;
-    const auto lista = partes();
     try {
-        mostraParte(linha, (*lista)[static_cast<std::size_t>(linha)].valor + *resto);
+        lvwFormas_->mostraValor(linha, *lvwFormas_->valor(linha) + *resto);
     } catch (const CurrencyOverflow&) {
-        return;
+        // A part that cannot take the remainder stays as it was.
     }
-    CalculaTot();
-}
-
-void frmLancMovCaixa::pedeValor() {
-    const int linha = lvwFormas_->currentRow();
-    if (linha < 0) return;
-    const auto valor = teclado_.pedirValor(lvwFormas_->item(linha, Descricao)->text());
-    if (!valor) return;
-    mostraParte(linha, *valor);
-    CalculaTot();
 }
 
 void frmLancMovCaixa::confirma() {
-    const auto lista = partes();
+    const auto lista = lvwFormas_->valores<ParcialPagamento>();
     if (!lista) {
         mensagens_.mensagem(QStringLiteral("Valor Inválido!"), Icone::Critico);
         return;

@@ -2,12 +2,12 @@
 
 #include "app/estado.h"
 #include "cash/lanca_mov_caixa.h"
+#include "cash/ui/lista_formas_valor.h"
 #include "common/message_port.h"
 #include "pos/teclado.h"
 
 #include <QDialog>
 #include <QLabel>
-#include <QTableWidget>
 
 #include <memory>
 #include <optional>
@@ -35,16 +35,11 @@ class frmLancMovCaixa : public QDialog {
     // not a number.
     std::optional<Currency> CalculaTot();
 
-    QTableWidget* lvwFormas() const { return lvwFormas_; }
+    ListaFormasValor* lvwFormas() const { return lvwFormas_; }
     QLabel* lblResto() const { return lblResto_; }
 
   private:
-    // The parts in list order; nullopt when one is not a number.
-    std::optional<std::vector<ParcialPagamento>> partes() const;
-    bool preencheLista();
-    void mostraParte(int linha, Currency valor);
     void tudo();
-    void pedeValor();
     void confirma();
 
     app::Estado& estado_;
@@ -53,7 +48,7 @@ class frmLancMovCaixa : public QDialog {
     pos::PedeValor& teclado_;
     Currency totalDoc_;
     std::vector<ParcialPagamento> resultado_;
-    QTableWidget* lvwFormas_;
+    ListaFormasValor* lvwFormas_;
     QLabel* lblTotalDoc_;
     QLabel* lblResto_;
 };

@@ -8,7 +8,6 @@
 
 #include <QGridLayout>
 #include <QHBoxLayout>
-#include <QHeaderView>
 #include <QMessageBox>
 #include <QPainter>
 #include <QPrintDialog>
@@ -21,21 +20,11 @@ namespace brasel::cash {
 
 namespace {
 
-enum Coluna { Codigo, Descricao, Valor };
-
 QPushButton* botao(const char* nome, const QString& texto, QWidget* pai) {
     auto* b = new QPushButton(texto, pai);
     b->setObjectName(QString::fromLatin1(nome));
     b->setMinimumSize(170, 64);
     return b;
-}
-
-QTableWidgetItem* celula(const QString& texto, bool editavel = false) {
-    auto* item = new QTableWidgetItem(texto);
-    Qt::ItemFlags flags = Qt::ItemIsSelectable | Qt::ItemIsEnabled;
-    if (editavel) flags |= Qt::ItemIsEditable;
-    item->setFlags(flags);
-    return item;
 }
 
 // The report's page: the text lines one under another, a new page when one is full.
@@ -175,19 +164,8 @@ frmRegistoDeCaixa::frmRegistoDeCaixa(app::Estado& estado, MessagePort& mensagens
     dtpData_->setCalendarPopup(true);
     dtpData_->setMinimumHeight(56);
 
-    lvwFormas_ = new QTableWidget(0, 3, this);
-    lvwFormas_->setObjectName(QStringLiteral("lvwFormas"));
-    lvwFormas_->setSelectionBehavior(QAbstractItemView::SelectRows);
-    lvwFormas_->setSelectionMode(QAbstractItemView::SingleSelection);
-    lvwFormas_->setEditTriggers(QAbstractItemView::DoubleClicked |
-                                QAbstractItemView::EditKeyPressed |
-                                QAbstractItemView::AnyKeyPressed);
-    lvwFormas_->verticalHeader()->hide();
-    lvwFormas_->verticalHeader()->setDefaultSectionSize(56);
-    Cab();
-    connect(lvwFormas_, &QTableWidget::itemChanged, this, [this](QTableWidgetItem* item) {
-        if (item->column() == Valor) CalculaTot();
-    });
+    lvwFormas_ = new ListaFormasValor(QStringLiteral("Valor"), estado_.param.casadec, this);
+    connect(lvwFormas_, &ListaFormasValor::valorAlterado, this, [this] { CalculaTot(); });
     lblTotal_ = new QLabel(this);
     lblTotal_->setObjectName(QStringLiteral("lblTotal"));
     lblTotal_->setAlignment(Qt::AlignRight | Qt::AlignVCenter);
@@ -210,7 +188,7 @@ frmRegistoDeCaixa::frmRegistoDeCaixa(app::Estado& estado, MessagePort& mensagens
         CarregarDados();
     });
     connect(dtpData_, &QDateEdit::dateChanged, this, [this] { CarregarDados(); });
-    connect(cmdValor, &QPushButton::clicked, this, [this] { pedeValor(); });
+    connect(cmdValor, &QPushButton::clicked, this, [this] { lvwFormas_->pedeValor(teclado_); });
     connect(cmdActualizar, &QPushButton::clicked, this, [this] { actualizar(); });
     connect(cmdImprimir, &QPushButton::clicked, this, [this] { imprimir(); });
     connect(cmdFechar, &QPushButton::clicked, this, &QDialog::reject);
@@ -249,14 +227,6 @@ frmRegistoDeCaixa::frmRegistoDeCaixa(app::Estado& estado, MessagePort& mensagens
 
 frmRegistoDeCaixa::~frmRegistoDeCaixa() = default;
 
-void frmRegistoDeCaixa::Cab() {
-    lvwFormas_->setHorizontalHeaderLabels(
-        {QStringLiteral("Código"), QStringLiteral("Forma de Pagamento"), QStringLiteral("Valor")});
-    lvwFormas_->horizontalHeader()->setSectionResizeMode(Descricao, QHeaderView::Stretch);
-    lvwFormas_->setColumnWidth(Codigo, 110);
-    lvwFormas_->setColumnWidth(Valor, 200);
-}
-
 void frmRegistoDeCaixa::showEvent(QShowEvent* evento) {
     QDialog::showEvent(evento);
     if (carregado_) return;
@@ -269,7 +239,6 @@ QString frmRegistoDeCaixa::data() const {
 }
 
 bool frmRegistoDeCaixa::CarregarDados() {
-    const QSignalBlocker bloqueio(lvwFormas_);
     lvwFormas_->setRowCount(0);
     const auto formas = FormasPagamento(estado_.gConn);
     if (!formas || formas->empty()) {
@@ -278,48 +247,15 @@ bool frmRegistoDeCaixa::CarregarDados() {
         return false;
     }
     const auto contado = CarregaRegistoCaixa(estado_.gConn, caixa(), data());
-    lvwFormas_->setRowCount(static_cast<int>(formas->size()));
-    for (int i = 0; i < lvwFormas_->rowCount(); ++i) {
-        const FormaPagamento& f = (*formas)[static_cast<std::size_t>(i)];
-        lvwFormas_->setItem(i, Codigo, celula(f.codigo));
-        lvwFormas_->setItem(i, Descricao, celula(f.descricao));
-        auto* valor = celula(QString(), true);
-        valor->setTextAlignment(Qt::AlignRight | Qt::AlignVCenter);
-        lvwFormas_->setItem(i, Valor, valor);
-        mostraValor(i, contado ? contado->value(f.codigo) : Currency());
-    }
-    lvwFormas_->selectRow(0);
+    lvwFormas_->preenche(*formas, contado.value_or(QHash<QString, Currency>{}));
     CalculaTot();
     return contado.has_value();
 }
 
-void frmRegistoDeCaixa::mostraValor(int linha, Currency valor) {
-    // Without grouping, so that the cell reads back as typed.
-    lvwFormas_->item(linha, Valor)->setText(valor.toText(estado_.param.casadec));
-}
-
-std::optional<std::vector<ContagemCaixa>> frmRegistoDeCaixa::contagem() const {
-    std::vector<ContagemCaixa> lista;
-    for (int i = 0; i < lvwFormas_->rowCount(); ++i) {
-        const pos::ValorTeclado v = pos::lerValorTeclado(lvwFormas_->item(i, Valor)->text());
-        if (!v.valido) return std::nullopt;
-        lista.push_back({lvwFormas_->item(i, Codigo)->text(), v.valor.value_or(Currency())});
-    }
-    return lista;
-}
-
 std::optional<Currency> frmRegistoDeCaixa::CalculaTot() {
-    const auto lista = contagem();
-    if (!lista) return std::nullopt;
-    try {
-        Currency total;
-        for (const ContagemCaixa& c : *lista)
-            total += c.valor;
-        lblTotal_->setText(NumeroParaTexto(total, estado_.param.casadec));
-        return total;
-    } catch (const CurrencyOverflow&) {
-        return std::nullopt;
-    }
+    const auto total = lvwFormas_->total();
+    if (total) lblTotal_->setText(NumeroParaTexto(*total, estado_.param.casadec));
+    return total;
 }
 
 void frmRegistoDeCaixa::pesquisa(bool forcar) {
@@ -327,17 +263,8 @@ void frmRegistoDeCaixa::pesquisa(bool forcar) {
                              [&](lookups::CampoCodigo& c) { pesquisaTabelas_.Caixas(c, forcar); });
 }
 
-void frmRegistoDeCaixa::pedeValor() {
-    const int linha = lvwFormas_->currentRow();
-    if (linha < 0) return;
-    const auto valor = teclado_.pedirValor(lvwFormas_->item(linha, Descricao)->text());
-    if (!valor) return;
-    mostraValor(linha, *valor);
-    CalculaTot();
-}
-
 void frmRegistoDeCaixa::actualizar() {
-    const auto lista = contagem();
+    const auto lista = lvwFormas_->valores<ContagemCaixa>();
     if (!lista) {
         mensagens_.mensagem(QStringLiteral("Valor Inválido!"), Icone::Critico);
         return;

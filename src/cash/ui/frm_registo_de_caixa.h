@@ -2,6 +2,7 @@
 
 #include "app/estado.h"
 #include "cash/registo_caixa.h"
+#include "cash/ui/lista_formas_valor.h"
 #include "common/message_port.h"
 #include "lookups/pesquisa_tabelas.h"
 #include "lookups/ui/w_pesquisa_nova.h"
@@ -11,7 +12,6 @@
 #include <QDialog>
 #include <QLabel>
 #include <QLineEdit>
-#include <QTableWidget>
 
 #include <memory>
 
@@ -46,7 +46,7 @@ class frmRegistoDeCaixa : public QDialog {
 
     QLineEdit* txtCaixa() const { return txtCaixa_; }
     QDateEdit* dtpData() const { return dtpData_; }
-    QTableWidget* lvwFormas() const { return lvwFormas_; }
+    ListaFormasValor* lvwFormas() const { return lvwFormas_; }
     QLabel* lblTotal() const { return lblTotal_; }
 
   protected:
@@ -54,12 +54,7 @@ class frmRegistoDeCaixa : public QDialog {
     void showEvent(QShowEvent* evento) override;
 
   private:
-    void Cab();
-    // The counted amounts in list order; nullopt when one is not a number.
-    std::optional<std::vector<ContagemCaixa>> contagem() const;
-    void mostraValor(int linha, Currency valor);
     void pesquisa(bool forcar);
-    void pedeValor();
     void actualizar();
     void imprimir();
 
@@ -72,7 +67,7 @@ class frmRegistoDeCaixa : public QDialog {
     QLineEdit* txtCaixa_;
     QLabel* lblCaixa_;
     QDateEdit* dtpData_;
-    QTableWidget* lvwFormas_;
+    ListaFormasValor* lvwFormas_;
     QLabel* lblTotal_;
     bool carregado_ = false;
 };
