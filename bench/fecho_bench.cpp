@@ -45,7 +45,8 @@ class Caixa : public pos::PerguntasFecho {
                                                            const QString&) override {
         return d;
     }
-    std::optional<std::vector<cash::ParcialPagamento>> divisaoCaixa(Currency total) override {
+    std::optional<std::vector<cash::ParcialPagamento>> divisaoCaixa(Currency total,
+                                                                    const QString&) override {
         return std::vector<cash::ParcialPagamento>{{QStringLiteral("NU"), total}};
     }
     devices::EscolhaImpressao escolhaImpressao(const QString&) override {

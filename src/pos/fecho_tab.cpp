@@ -397,7 +397,8 @@ Fecho FecharTab(Tab& tab, PerguntasFecho& perguntas) {
     }
 
     if (estado.gVariosPagaComo && temEfeito(tab.tipo().afectaCaixa)) {
-        dados.divisao = perguntas.divisaoCaixa(tab.lista().totais.total);
+        dados.divisao = perguntas.divisaoCaixa(
+            tab.lista().totais.total, dados.pagamento ? dados.pagamento->pagaComo : QString());
         if (!dados.divisao) return fecho;
     }
 

@@ -46,8 +46,10 @@ class PerguntasFecho {
     // The walk-in customer's data for a document dated `data`, starting from `propostos`.
     virtual std::optional<DadosClienteDiverso> clienteDiverso(const DadosClienteDiverso& propostos,
                                                               const QString& data) = 0;
-    // The split of the total over several payment methods; nullopt when cancelled.
-    virtual std::optional<std::vector<cash::ParcialPagamento>> divisaoCaixa(Currency totalDoc) = 0;
+    // The split of the total over several payment methods, starting with the whole total on
+    // `pagaComo` (the method chosen at payment, "" none); nullopt when cancelled.
+    virtual std::optional<std::vector<cash::ParcialPagamento>> divisaoCaixa(
+        Currency totalDoc, const QString& pagaComo) = 0;
     // The print choice and copies for a document of type `tipo` (receipts, or the copies of a
     // full page for a user who does not print tickets).
     virtual devices::EscolhaImpressao escolhaImpressao(const QString& tipo) = 0;

@@ -102,6 +102,27 @@ TEST_F(LancMovCaixaJanela, OkWaitsForThePartsToMakeTheTotal) {
                                                       {QStringLiteral("NU"), V("4.10")}}));
 }
 
+TEST_F(LancMovCaixaJanela, TheMethodChosenAtPaymentStartsWithTheWholeTotal) {
+    frmLancMovCaixa janela(e_, mensagens_, nullptr, &teclado_);
+    int seleccionada = -1;
+    int proposta = -2;
+    noDialogo([&](QWidget* d) {
+        seleccionada = janela.lvwFormas()->currentRow();
+        proposta = linhaDe(janela.lvwFormas(), "MB");
+        clicar(d, "cmdOK");
+    });
+    const auto partes = janela.Carregar(V("7.45"), QStringLiteral("MB"));
+    ASSERT_TRUE(partes);
+    EXPECT_EQ(seleccionada, proposta);
+    Currency total;
+    for (const ParcialPagamento& p : *partes) {
+        total += p.valor;
+        EXPECT_EQ(p.valor, p.pagaComo == u"MB" ? V("7.45") : V("0")) << p.pagaComo.toStdString();
+    }
+    EXPECT_EQ(total, V("7.45"));
+    EXPECT_TRUE(mensagens_.textos().isEmpty());
+}
+
 TEST_F(LancMovCaixaJanela, APartThatIsNotANumberOrACancelGivesNothing) {
     frmLancMovCaixa janela(e_, mensagens_, nullptr, &teclado_);
     bool aberta = false;

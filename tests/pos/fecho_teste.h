@@ -48,8 +48,9 @@ class PerguntasFechoGravadas : public PerguntasFecho {
         perguntas << QStringLiteral("diverso ") + data;
         return diverso;
     }
-    std::optional<std::vector<cash::ParcialPagamento>> divisaoCaixa(Currency totalDoc) override {
-        perguntas << QStringLiteral("divisao ") + totalDoc.toPlainText();
+    std::optional<std::vector<cash::ParcialPagamento>> divisaoCaixa(
+        Currency totalDoc, const QString& pagaComo) override {
+        perguntas << QStringLiteral("divisao ") + totalDoc.toPlainText() + u' ' + pagaComo;
         return divisao;
     }
     devices::EscolhaImpressao escolhaImpressao(const QString& tipo) override {

@@ -74,7 +74,8 @@ frmLancMovCaixa::frmLancMovCaixa(app::Estado& estado, MessagePort& mensagens, QW
 
 frmLancMovCaixa::~frmLancMovCaixa() = default;
 
-std::optional<std::vector<ParcialPagamento>> frmLancMovCaixa::Carregar(Currency totalDoc) {
+std::optional<std::vector<ParcialPagamento>> frmLancMovCaixa::Carregar(Currency totalDoc,
+                                                                       const QString& proposta) {
     totalDoc_ = totalDoc;
     resultado_.clear();
     const auto formas = FormasPagamento(estado_.gConn);
@@ -82,7 +83,13 @@ std::optional<std::vector<ParcialPagamento>> frmLancMovCaixa::Carregar(Currency 
         mensagens_.mensagem(QStringLiteral("Processo Incompleto!"), Icone::Critico);
         return std::nullopt;
     }
-    lvwFormas_->preenche(*formas);
+    // A document paid by one method, as most are, needs only OK.
+    QHash<QString, Currency> propostos;
+    if (!proposta.isEmpty()) propostos.insert(proposta, totalDoc_);
+    lvwFormas_->preenche(*formas, propostos);
+    for (int i = 0; i < lvwFormas_->rowCount(); ++i)
+        if (lvwFormas_->item(i, ListaFormasValor::Codigo)->text() == proposta)
+            lvwFormas_->selectRow(i);
     lblTotalDoc_->setText(NumeroParaTexto(totalDoc_, estado_.param.casadec));
     CalculaTot();
     if (exec() != QDialog::Accepted) return std::nullopt;

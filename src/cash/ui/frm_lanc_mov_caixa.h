@@ -27,9 +27,11 @@ class frmLancMovCaixa : public QDialog {
                     pos::PedeValor* teclado = nullptr);
     ~frmLancMovCaixa() override;
 
-    // Lists the methods and shows the window modally for a document of `totalDoc`: every
+    // Lists the methods and shows the window modally for a document of `totalDoc`, the whole
+    // total proposed on `proposta` (the method already chosen at payment, "" none): every
     // method's part, or nullopt when the cashier cancelled or the methods could not be listed.
-    std::optional<std::vector<ParcialPagamento>> Carregar(Currency totalDoc);
+    std::optional<std::vector<ParcialPagamento>> Carregar(Currency totalDoc,
+                                                          const QString& proposta = {});
 
     // Shows what is left of the total; nullopt (and the remainder as it was) while a part is
     // not a number.

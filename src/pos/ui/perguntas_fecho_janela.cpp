@@ -44,9 +44,9 @@ std::optional<DadosClienteDiverso> PerguntasFechoJanela::clienteDiverso(
 }
 
 std::optional<std::vector<cash::ParcialPagamento>> PerguntasFechoJanela::divisaoCaixa(
-    Currency totalDoc) {
+    Currency totalDoc, const QString& pagaComo) {
     cash::frmLancMovCaixa janela(estado_, mensagens_, pai_);
-    return janela.Carregar(totalDoc);
+    return janela.Carregar(totalDoc, pagaComo);
 }
 
 devices::EscolhaImpressao PerguntasFechoJanela::escolhaImpressao(const QString& tipo) {

@@ -29,7 +29,8 @@ class PerguntasFechoJanela : public PerguntasFecho {
                      Currency troco) override;
     std::optional<DadosClienteDiverso> clienteDiverso(const DadosClienteDiverso& propostos,
                                                       const QString& data) override;
-    std::optional<std::vector<cash::ParcialPagamento>> divisaoCaixa(Currency totalDoc) override;
+    std::optional<std::vector<cash::ParcialPagamento>> divisaoCaixa(
+        Currency totalDoc, const QString& pagaComo) override;
     devices::EscolhaImpressao escolhaImpressao(const QString& tipo) override;
 
     // Closes the change display, once the next customer's first product is added.
