@@ -145,6 +145,8 @@ inline constexpr DefFlag ConfigRest_LimpaDocAposFechaDoc{kSeccaoBrasel,
 inline constexpr DefNivelEmenta NivelEmenta{kSeccaoBrasel, "NivelEmenta"};
 inline constexpr DefTexto TipoImprimeMesa{kSeccaoBrasel, "TipoImprimeMesa"};
 inline constexpr DefTexto Divisao_Obs{kSeccaoBrasel, "Divisao_Obs"};
+// The walk-in customer form's load-data box.
+inline constexpr DefFlag CarregaDados{kSeccaoBrasel, "CarregaDados"};
 inline constexpr DefCorUtilizador JanBackColor{kSeccaoBrasel, "JanBackColor"};
 
 // Window geometry, with the design values of each window as defaults.

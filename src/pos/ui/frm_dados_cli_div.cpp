@@ -16,9 +16,6 @@ namespace brasel::pos {
 
 namespace {
 
-// The state of the load-data box, kept by the workstation.
-constexpr app::DefFlag kCarregaDados{app::kSeccaoBrasel, "CarregaDados"};
-
 QPushButton* botao(QWidget* pai, const char* nome, const QString& texto) {
     auto* b = new QPushButton(texto, pai);
     b->setObjectName(QString::fromLatin1(nome));
@@ -48,7 +45,7 @@ frmDadosCliDiv::frmDadosCliDiv(app::Estado& estado, MessagePort& mensagens, QWid
     txtPais_ = campo("txtPais");
     chkCarregaDados_ = new QCheckBox(QStringLiteral("Carregar Dados"), this);
     chkCarregaDados_->setObjectName(QStringLiteral("chkCarregaDados"));
-    chkCarregaDados_->setChecked(kCarregaDados.ler());
+    chkCarregaDados_->setChecked(app::posto::CarregaDados.ler());
     auto* contribuinte = new QHBoxLayout;
     contribuinte->addWidget(txtContribuinte_, 1);
     contribuinte->addWidget(chkCarregaDados_);
@@ -76,7 +73,7 @@ frmDadosCliDiv::frmDadosCliDiv(app::Estado& estado, MessagePort& mensagens, QWid
 
     connect(txtContribuinte_, &QLineEdit::editingFinished, this, &frmDadosCliDiv::carregaDados);
     connect(chkCarregaDados_, &QCheckBox::toggled, this,
-            [](bool ligado) { kCarregaDados.gravar(ligado); });
+            [](bool ligado) { app::posto::CarregaDados.gravar(ligado); });
     connect(cmdCodPost, &QPushButton::clicked, this, &frmDadosCliDiv::pesquisaCodPost);
     connect(cmdFechaDiv, &QPushButton::clicked, this, &frmDadosCliDiv::fechaDiv);
     connect(cmdCancelar, &QPushButton::clicked, this, &QDialog::reject);
