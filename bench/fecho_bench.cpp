@@ -52,6 +52,7 @@ class Caixa : public pos::PerguntasFecho {
     devices::EscolhaImpressao escolhaImpressao(const QString&) override {
         return {devices::EscolhaImpressao::TalaoCompra, 1, false};
     }
+    bool autorizaSupervisor() override { return false; }
 };
 
 // Table M01's tab under the cash-sale type, its receipts going to a simulated ticket printer.

@@ -7,6 +7,7 @@
 #include "devices/mostra_no_display.h"
 #include "devices/talao_documento.h"
 #include "documents/cabecalho_movimento.h"
+#include "documents/controlo_credito.h"
 #include "documents/numeracao.h"
 #include "pos/abertura_mesa.h"
 #include "pricing/arredonda.h"
@@ -332,6 +333,12 @@ Fecho FecharTab(Tab& tab, PerguntasFecho& perguntas) {
     if (!tab.temMesaETipo() || seleccionadas == 0) {
         m.mensagem(QStringLiteral("NÃO SELECCIONOU QUALQUER PRODUTO!"), Icone::Critico);
         return fecho;
+    }
+    if (const auto recusa = documents::VerificaCreditoCliente(
+            estado.gConn, tab.mesa().codigo, tab.lista().totais.total, tab.tipo().codigo,
+            QDate::currentDate(), estado.param.casadec)) {
+        m.mensagem(recusa->texto, Icone::Exclamacao);
+        if (!recusa->autorizavel || !perguntas.autorizaSupervisor()) return fecho;
     }
     if (static_cast<std::size_t>(seleccionadas) < linhas.size())
         m.mensagem(QStringLiteral("NÃO TEM OS PRODUTOS TODOS SELECCIONADOS!"), Icone::Informacao,

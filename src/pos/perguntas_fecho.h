@@ -53,6 +53,9 @@ class PerguntasFecho {
     // The print choice and copies for a document of type `tipo` (receipts, or the copies of a
     // full page for a user who does not print tickets).
     virtual devices::EscolhaImpressao escolhaImpressao(const QString& tipo) = 0;
+    // The supervisor's password, letting a document through that exceeds the customer's credit
+    // limit; false when it was not given.
+    virtual bool autorizaSupervisor() = 0;
 };
 
 }  // namespace brasel::pos

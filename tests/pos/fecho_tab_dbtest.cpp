@@ -401,5 +401,40 @@ TEST_P(ProximoTeste, MesaSeguinte) {
 INSTANTIATE_TEST_SUITE_P(Casos, ProximoTeste,
                          ::testing::Values(Proximo{1, true}, Proximo{0, false}));
 
+// An invoice beyond the table's credit limit: refused without the supervisor, leaving nothing
+// behind, and closed once the supervisor lets it through.
+TEST_F(FechoTabTeste, LimiteDeCreditoSoPassaComOSupervisor) {
+    executa(QStringLiteral("update TabTipoMov set Autorizacao='1' where codigo='FT'"));
+    executa(QStringLiteral("update Clientes set LimiteCredito=? where Codigo='M01'"),
+            {QStringLiteral("100")});
+    executa(QStringLiteral("insert into MovCliente (Codigo,Tipo,Numero,Ano,Afecta,saldodoc,"
+                           "datavenc) values ('M01','FT','00000099','2025','D+',?,'2999-01-01')"),
+            {QStringLiteral("100")});
+    ASSERT_TRUE(tab_.definirTipo(QStringLiteral("FT")));
+    ASSERT_TRUE(AbrirMesa(tab_, QStringLiteral("M01")));
+    adiciona({"B001", "B002"});
+    const auto documentosFT = [this] {
+        return contar(QStringLiteral("select count(*) from MovCliente where Tipo='FT' and "
+                                     "Ano=?"),
+                      {ano_});
+    };
+
+    EXPECT_EQ(FecharTab(tab_, f_).resultado, ResultadoFecho::Recusado);
+    ASSERT_EQ(m_.textos().size(), 1);
+    EXPECT_TRUE(m_.textos().front().startsWith(u"O Cliente ultrapassa o Limite de Crédito!"))
+        << m_.textos().front().toStdString();
+    EXPECT_EQ(f_.perguntas, QStringList{QStringLiteral("supervisor")});
+    EXPECT_EQ(documentosFT(), 0);
+    EXPECT_EQ(linhasFechadas(), 0);
+    EXPECT_EQ(linhasAbertas(), 2);
+    EXPECT_EQ(ultNumero("FT"), QStringLiteral("00000000"));
+
+    f_.supervisorAutoriza = true;
+    const Fecho r = FecharTab(tab_, f_);
+    EXPECT_EQ(r.resultado, ResultadoFecho::Fechado) << m_.textos().join(u'|').toStdString();
+    EXPECT_EQ(documentosFT(), 1);
+    EXPECT_EQ(linhasFechadas(), 2);
+}
+
 }  // namespace
 }  // namespace brasel::pos

@@ -27,6 +27,7 @@ class PerguntasFechoGravadas : public PerguntasFecho {
     std::optional<DadosClienteDiverso> diverso;
     std::optional<std::vector<cash::ParcialPagamento>> divisao;
     devices::EscolhaImpressao escolha{devices::EscolhaImpressao::Nenhum, 0, false};
+    bool supervisorAutoriza = false;
     QStringList perguntas;
 
     QString confirmaUtilizador() override {
@@ -56,6 +57,10 @@ class PerguntasFechoGravadas : public PerguntasFecho {
     devices::EscolhaImpressao escolhaImpressao(const QString& tipo) override {
         perguntas << QStringLiteral("impressao ") + tipo;
         return escolha;
+    }
+    bool autorizaSupervisor() override {
+        perguntas << QStringLiteral("supervisor");
+        return supervisorAutoriza;
     }
 };
 

@@ -36,6 +36,10 @@ Tabela clientes() {
         .inteiro({"ClientePontos", "ControlaContaCorrente"})
         .montante({"PontosSomaValor", "ValorCarrespondenteSoma", "PontosSubtraiValor",
                    "ValorCarrespondenteSubtrai", "ValorMinimoPontos"})
+        // Credit control, off by default: LimiteCredito 0 is no limit, ControlaVencidos 1 refuses
+        // documents on account while the customer has overdue ones.
+        .montante({"LimiteCredito"})
+        .inteiro({"ControlaVencidos"})
         .unico({"Codigo"});
 }
 

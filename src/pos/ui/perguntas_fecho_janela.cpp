@@ -1,6 +1,7 @@
 #include "pos/ui/perguntas_fecho_janela.h"
 
 #include "app/ui/frm_confirmacao_utilizador.h"
+#include "app/ui/frm_password_supervisor.h"
 #include "cash/ui/frm_lanc_mov_caixa.h"
 #include "cash/ui/frm_troco.h"
 #include "devices/ui/frm_impresao.h"
@@ -52,6 +53,12 @@ std::optional<std::vector<cash::ParcialPagamento>> PerguntasFechoJanela::divisao
 devices::EscolhaImpressao PerguntasFechoJanela::escolhaImpressao(const QString& tipo) {
     devices::frmImpresao janela(estado_, mensagens_, linha_, pai_);
     return devices::DesempacotaEscolha(janela.Abrir(tipo));
+}
+
+bool PerguntasFechoJanela::autorizaSupervisor() {
+    // Always asked: a workstation that skips the password for kitchen lines does not skip it here.
+    app::frmPasswordSupervisor password(estado_, mensagens_, pai_);
+    return password.Confirma_bln();
 }
 
 }  // namespace brasel::pos

@@ -14,8 +14,8 @@
 namespace brasel::pos {
 
 // The closing's questions answered by the windows: the user confirmation, the payment screen
-// and the change display, the walk-in customer's data, the split over payment methods and the
-// print choice.
+// and the change display, the walk-in customer's data, the split over payment methods, the
+// print choice and the supervisor's authorisation.
 class PerguntasFechoJanela : public PerguntasFecho {
   public:
     PerguntasFechoJanela(app::Estado& estado, MessagePort& mensagens, devices::LinhaSerie& linha,
@@ -32,6 +32,7 @@ class PerguntasFechoJanela : public PerguntasFecho {
     std::optional<std::vector<cash::ParcialPagamento>> divisaoCaixa(
         Currency totalDoc, const QString& pagaComo) override;
     devices::EscolhaImpressao escolhaImpressao(const QString& tipo) override;
+    bool autorizaSupervisor() override;
 
     // Closes the change display, once the next customer's first product is added.
     void fechaTroco();
