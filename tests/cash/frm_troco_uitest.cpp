@@ -3,6 +3,7 @@
 #include "cash/ui/frm_troco.h"
 #include "cash/ui/frm_troco_espera.h"
 
+#include "cash/teclado_gravado.h"
 #include "support/aplicacao_teste.h"
 #include "support/apoio_arranque.h"
 #include "support/empresa_teste.h"
@@ -14,10 +15,10 @@
 #include <QLineEdit>
 #include <QTreeWidget>
 
-#include <deque>
-
 namespace brasel::cash {
 namespace {
+
+using teste::TecladoGravado;
 
 using testing::clicar;
 using testing::filho;
@@ -30,20 +31,6 @@ QString T(const char* s) {
 Currency V(const char* s) {
     return *Currency::parse(QString::fromLatin1(s));
 }
-
-// The keypad of the tests: the scripted answers in order, and the titles it was asked with.
-class TecladoGravado : public pos::PedeValor {
-  public:
-    std::optional<Currency> pedirValor(const QString& titulo) override {
-        titulos << titulo;
-        if (respostas.empty()) return std::nullopt;
-        const auto v = respostas.front();
-        respostas.pop_front();
-        return v;
-    }
-    std::deque<std::optional<Currency>> respostas;
-    QStringList titulos;
-};
 
 class FrmTrocoTeste : public ::testing::Test {
   protected:

@@ -1,5 +1,6 @@
 // The split of a payment across methods, offscreen: parts typed in the cells or on the keypad,
 // cmdTudo, and OK refused until the parts make the document total.
+#include "cash/teclado_gravado.h"
 #include "cash/ui/frm_lanc_mov_caixa.h"
 #include "pricing/valores_teste.h"
 #include "support/aplicacao_teste.h"
@@ -9,30 +10,16 @@
 #include "support/janelas_teste.h"
 #include "support/mensagens_gravadas.h"
 
-#include <deque>
-
 namespace brasel::cash {
 namespace {
+
+using teste::TecladoGravado;
 
 using testing::clicar;
 using testing::MensagensGravadas;
 using testing::noDialogo;
 
 using pricing::teste::V;
-
-// The keypad answering from a script.
-class TecladoGravado : public pos::PedeValor {
-  public:
-    std::optional<Currency> pedirValor(const QString& titulo) override {
-        titulos << titulo;
-        if (respostas.empty()) return std::nullopt;
-        const auto r = respostas.front();
-        respostas.pop_front();
-        return r;
-    }
-    std::deque<std::optional<Currency>> respostas;
-    QStringList titulos;
-};
 
 class LancMovCaixaJanela : public ::testing::Test {
   protected:

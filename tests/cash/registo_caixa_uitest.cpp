@@ -2,6 +2,7 @@
 // of destination and its PDF; the change of the workstation's register.
 #include "app/definicoes_posto.h"
 #include "cash/caixa_teste.h"
+#include "cash/teclado_gravado.h"
 #include "cash/ui/frm_alt_caixa.h"
 #include "cash/ui/frm_registo_de_caixa.h"
 #include "support/aplicacao_teste.h"
@@ -20,26 +21,15 @@
 #include <QTemporaryDir>
 #include <QTimer>
 
-#include <deque>
-
 namespace brasel::cash {
 namespace {
+
+using teste::TecladoGravado;
 
 using teste::V;
 using testing::clicar;
 using testing::filho;
 using testing::MensagensGravadas;
-
-class TecladoGravado : public pos::PedeValor {
-  public:
-    std::optional<Currency> pedirValor(const QString&) override {
-        if (respostas.empty()) return std::nullopt;
-        const auto r = respostas.front();
-        respostas.pop_front();
-        return r;
-    }
-    std::deque<std::optional<Currency>> respostas;
-};
 
 class PesquisaGravada : public lookups::JanelaPesquisa {
   public:
